@@ -1,0 +1,170 @@
+#include "control/MainCard.h"
+
+#include "common/Failure.h"
+#include "common/FileDialogs.h"
+#include "common/Messages.h"
+#include "common/SessionState.h"
+#include "control/ClickableLabel.h"
+#include "control/SetGetCtrl.h"
+#include "control/Tag.h"
+#include "control/pages/Pages.h"
+#include "db/ui/LogonDialog.h"
+
+#include <QComboBox>
+#include <QCoreApplication>
+#include <QEvent>
+#include <QFocusEvent>
+#include <QFrame>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QTabWidget>
+#include <QToolButton>
+#include <QVBoxLayout>
+
+using namespace Qt::StringLiterals;
+
+namespace pelmar {
+
+MainCard::MainCard(Services services, SessionState& state, QWidget* parent)
+    : QWidget(parent), services_(services), state_(state)
+{
+    setObjectName(u"MainCard"_s);
+    buildPages();
+    connectHandlers();
+}
+
+void MainCard::buildPages()
+{
+    auto* layout = new QVBoxLayout(this);
+    c_.SSTab1 = new QTabWidget;
+    c_.SSTab1->setObjectName(u"SSTab1"_s);
+    c_.SSTab1->addTab(buildLabelPage(c_), u"הגדרות מדבקת כתובת"_s);
+    c_.SSTab1->addTab(buildLettersPage(c_), u"הגדרות למשלוח מכתב"_s);
+    c_.SSTab1->addTab(buildEmailPage(c_), u"הגדרות למשלוח דוא\"ל"_s);
+    c_.SSTab1->addTab(buildCriteriaPage(c_), u"טווח הכרטיסים"_s);
+    c_.SSTab1->addTab(buildGeneralPage(c_), u"הגדרות כלליות"_s);
+    layout->addWidget(c_.SSTab1, 1);
+    layout->addWidget(buildCommandStrip(c_));
+}
+
+void MainCard::connectHandlers()
+{
+    connect(c_.CmdLabPrev, &QPushButton::clicked, this, &MainCard::CmdLabPrev_Click);
+    connect(c_.CmdPreview, &QPushButton::clicked, this, &MainCard::CmdPreview_Click);
+    connect(c_.CmdDef, &QPushButton::clicked, this, &MainCard::CmdDef_Click);
+    connect(c_.cmdStop, &QPushButton::clicked, this, &MainCard::cmdStop_Click);
+    connect(c_.CmdConnect, &QPushButton::clicked, this, &MainCard::CmdConnect_Click);
+    connect(c_.LblDept, &ClickableLabel::clicked, this, &MainCard::LblDept_Click);
+    connect(c_.Label56, &ClickableLabel::doubleClicked, this, &MainCard::Label56_DblClick);
+    for (int i = 1; i <= 3; ++i)
+        connect(c_.CmdDir[i], &QToolButton::clicked, this, [this, i] { CmdDir_Click(i); });
+    c_.cmbCS->installEventFilter(this);
+}
+
+bool MainCard::eventFilter(QObject* watched, QEvent* event)
+{
+    // The card type's groups belong to one type: leaving the list forgets the chosen groups.
+    if (watched == c_.cmbCS && event->type() == QEvent::FocusOut
+        && static_cast<QFocusEvent*>(event)->reason() != Qt::PopupFocusReason)
+        cmbCS_Validate();
+    return QWidget::eventFilter(watched, event);
+}
+
+void MainCard::cmbCS_Validate()
+{
+    state_.clearCardGroups();
+}
+
+void MainCard::CmdDef_Click()
+{
+    SetGetRegParams(kSave);
+}
+
+void MainCard::CmdConnect_Click()
+{
+    showLogonDialog(services_, state_, this);
+    UserControl_Initialize();
+}
+
+void MainCard::cmdStop_Click()
+{
+    state_.StopRequested = true;
+    QCoreApplication::processEvents();
+}
+
+void MainCard::LblDept_Click()
+{
+    const QString tag = tagOf(c_.LblDept);
+    if (tag.isEmpty() || tag == u"0"_s) {
+        c_.LblDept->setText(u"תפקיד"_s);
+        setTag(c_.LblDept, u"1"_s);
+    } else if (tag == u"1"_s) {
+        c_.LblDept->setText(u"מחלקה"_s);
+        setTag(c_.LblDept, u"0"_s);
+    }
+}
+
+void MainCard::showDeptCaption()
+{
+    const QString tag = tagOf(c_.LblDept);
+    if (tag.isEmpty() || tag == u"0"_s)
+        c_.LblDept->setText(u"מחלקה"_s);
+    else if (tag == u"1"_s)
+        c_.LblDept->setText(u"תפקיד"_s);
+}
+
+short MainCard::GetOLEOption() const
+{
+    if (c_.OptOLE[1]->isChecked())
+        return 1;
+    return c_.OptOLE[2]->isChecked() ? 2 : 0;
+}
+
+QString MainCard::PickOpenFile(int index)
+{
+    static const QString filters[] = {
+        {},
+        u"All Files (*.*)|*.*|HTML Files (*.htm,*.html)|*.htm;*.html"_s,
+        u"All Files (*.*)|*.*"_s,
+        u"All Files (*.*)|*.*|Word Files (*.doc)|*.doc"_s,
+    };
+    return services_.files.openFile(filters[index], 2);
+}
+
+void MainCard::CmdDir_Click(int index)
+{
+    QLineEdit* targets[] = {nullptr, c_.txtEmailHTMLBody, c_.txtEmailAttachFile, c_.txtFaxFile};
+    if (index < 1 || index > 3)
+        return;
+    const QString path = PickOpenFile(index);
+    if (!path.isEmpty())
+        targets[index]->setText(path);
+}
+
+void MainCard::setProgress(long processed, long total)
+{
+    const int full = c_.ProgressFrame->width();
+    const int width = total > 0 ? qRound(double(processed) / double(total) * full) : 0;
+    const int x = layoutDirection() == Qt::RightToLeft ? full - width : 0;
+    c_.ProgressFill->setGeometry(x, 0, width, c_.ProgressFrame->height());
+}
+
+void MainCard::setProgressText(const QString& text)
+{
+    c_.Message1->setText(text);
+}
+
+void MainCard::guarded(const std::function<void()>& handler)
+{
+    try {
+        handler();
+    } catch (const Failure& failure) {
+        services_.messages.critical(u"תקלה"_s, failure.description());
+    } catch (const std::exception& error) {
+        services_.messages.critical(u"תקלה"_s, QString::fromLocal8Bit(error.what()));
+    }
+}
+
+}  // namespace pelmar

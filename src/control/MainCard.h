@@ -1,0 +1,77 @@
+#pragma once
+
+#include "control/MainCardControls.h"
+#include "control/Services.h"
+
+#include <QString>
+#include <QWidget>
+
+#include <functional>
+
+namespace pelmar {
+
+struct SessionState;
+
+// The mailing control: five pages of options, the output chosen in cmbOutType, and the buttons
+// that run it, preview its recipients and save the options. Everything runs on the user
+// interface thread; a run that yields (processEvents) lets the stop button set the stop flag.
+class MainCard : public QWidget {
+    Q_OBJECT
+public:
+    MainCard(Services services, SessionState& state, QWidget* parent = nullptr);
+
+    // Start-up: connection settings, run log, connection test and sales employees, every option,
+    // label styles, picker state, department caption, criteria page. Each step's failure is
+    // passed over. Runs again after the logon dialog.
+    void UserControl_Initialize();
+
+    // 1 saves every option of the pages to section "Params", 2 loads them; other values walk the
+    // options and change nothing. A key that cannot be written, read or assigned is skipped.
+    void SetGetRegParams(unsigned char action);
+
+    // Refills CmbAgent from OSLP (item data = SlpCode); on any failure, or when OSLP is empty,
+    // the list keeps what it has.
+    void FillCmbAgent();
+
+    // 1 when the WinFax option is chosen, else 2 for the fax service, else 0.
+    short GetOLEOption() const;
+
+    // Button and label handlers.
+    void CmdLabPrev_Click();
+    void CmdPreview_Click();
+    void CmdDef_Click();
+    void cmdStop_Click();
+    void CmdConnect_Click();
+    void CmdDir_Click(int index);
+    void LblDept_Click();
+    void Label56_DblClick();
+    void cmbCS_Validate();
+
+    // Progress of a run: the fill gets processed / total of the frame's width; 0 clears it.
+    void setProgress(long processed, long total);
+    void setProgressText(const QString& text);
+
+    const MainCardControls& controls() const { return c_; }
+    SessionState& state() { return state_; }
+    const Services& services() const { return services_; }
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    struct OutputType;
+    static const OutputType& outputTypeAt(int listIndex);
+
+    void buildPages();
+    void connectHandlers();
+    void showDeptCaption();
+    void runOutput(const OutputType& output);
+    void guarded(const std::function<void()>& handler);
+    QString PickOpenFile(int index);
+
+    Services services_;
+    SessionState& state_;
+    MainCardControls c_;
+};
+
+}  // namespace pelmar

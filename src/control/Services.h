@@ -1,0 +1,21 @@
+#pragma once
+
+namespace pelmar {
+
+class BrowserWindow;
+class DatabaseClient;
+class FileDialogs;
+class Messages;
+class SettingsStore;
+
+// The outside systems the control works with. The program hands it the real ones
+// (see RealServices); tests hand it recording fakes. The control does not own them.
+struct Services {
+    Messages& messages;
+    BrowserWindow& browser;
+    FileDialogs& files;
+    SettingsStore& settings;
+    DatabaseClient& database;
+};
+
+}  // namespace pelmar

@@ -1,0 +1,135 @@
+#include "control/ClickableLabel.h"
+#include "control/MainCardControls.h"
+#include "control/Widgets.h"
+#include "control/pages/Pages.h"
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QGridLayout>
+#include <QGroupBox>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QVBoxLayout>
+
+using namespace Qt::StringLiterals;
+
+namespace pelmar {
+
+namespace {
+
+// The label lines in the order they stand on a standard label, with the text of each line's box.
+struct LineRow {
+    int line;
+    QString box;
+    QString caption;
+};
+
+const QList<LineRow>& lineRows()
+{
+    static const QList<LineRow> rows = {
+        {0, u" לכבוד"_s, {}},
+        {11, u"להציג טקסט קבוע מעל שם כרטיס?"_s, {}},
+        {1, u"להציג שם כרטיס?"_s, u" שם כרטיס"_s},
+        {12, u"להציג טקסט קבוע מתחת לשם כרטיס?"_s, {}},
+        {2, u" קוד כרטיס:"_s, {}},
+        {3, u" לידי: איש קשר"_s, {}},
+        {6, u"להציג מחלקה/תפקיד?"_s, {}},
+        {4, u" כתובת"_s, {}},
+        {7, u" גוש"_s, {}},
+        {5, u" עיר"_s, u"מיקוד "_s},
+        {8, u" מחוז"_s, {}},
+        {9, u" מדינה"_s, {}},
+        {10, u" ארץ"_s, {}},
+    };
+    return rows;
+}
+
+QGroupBox* buildLines(MainCardControls& c)
+{
+    QGridLayout* grid = nullptr;
+    QGroupBox* group = groupBox(u"תוכן המדבקה: (סמן את השורות הרצויות)"_s, grid);
+    int row = 0;
+    for (const LineRow& line : lineRows()) {
+        QCheckBox* box = checkBox(arrayName("ChkTitle", line.line), line.box);
+        c.ChkTitle[line.line] = box;
+        grid->addWidget(box, row, 0);
+        if (line.line == 6) {
+            c.LblDept = new ClickableLabel(u"מחלקה"_s);
+            c.LblDept->setObjectName(u"LblDept"_s);
+            c.LblDept->setToolTip(u"תקתק להחלפת שדה"_s);
+            c.LblDept->setCursor(Qt::PointingHandCursor);
+            grid->addWidget(c.LblDept, row, 1);
+        } else if (!line.caption.isEmpty()) {
+            grid->addWidget(caption(line.caption), row, 1);
+        }
+        ++row;
+    }
+    c.chkShowAttn = checkBox(u"chkShowAttn"_s, u"להציג כותרת לידי"_s);
+    c.chkDeptNewLine = checkBox(u"chkDeptNewLine"_s, u"להציג בשורה חדשה?"_s);
+    grid->addWidget(c.chkShowAttn, row++, 0, 1, 2);
+    grid->addWidget(c.chkDeptNewLine, row++, 0, 1, 2);
+    grid->setColumnStretch(2, 1);
+    return group;
+}
+
+QGroupBox* buildPageLayout(MainCardControls& c)
+{
+    QGridLayout* grid = nullptr;
+    QGroupBox* group = groupBox(u"מבנה הדף:"_s, grid);
+    c.txtRows = textBox(u"txtRows"_s, u"8"_s);
+    c.txtCols = textBox(u"txtCols"_s, u"3"_s);
+    c.txtCopies = textBox(u"txtCopies"_s, u"1"_s);
+    c.txtStartFrom = textBox(u"txtStartFrom"_s, u"1"_s);
+    c.cmbLabFormat = listBox(u"cmbLabFormat"_s, {u"תבנית סטנדרטית"_s, u"איש קשר מעל שם חברה"_s});
+    c.cmbAddressFrom = listBox(u"cmbAddressFrom"_s,
+                               {u"כתובת למשלוח דואר"_s, u"כתובת בכרטיס"_s, u"כתובת מהמסמכים"_s});
+    grid->addWidget(caption(u"שורות"_s), 0, 0);
+    grid->addWidget(c.txtRows, 0, 1);
+    grid->addWidget(caption(u"עמודות"_s), 1, 0);
+    grid->addWidget(c.txtCols, 1, 1);
+    grid->addWidget(caption(u"עותקים:"_s), 2, 0);
+    grid->addWidget(c.txtCopies, 2, 1);
+    grid->addWidget(caption(u"התחל ממדבקה:"_s), 3, 0);
+    grid->addWidget(c.txtStartFrom, 3, 1);
+    grid->addWidget(caption(u"תבנית המדבקה:"_s), 4, 0);
+    grid->addWidget(c.cmbLabFormat, 4, 1);
+    grid->addWidget(caption(u"כתובות:"_s), 5, 0);
+    grid->addWidget(c.cmbAddressFrom, 5, 1);
+    return group;
+}
+
+QGroupBox* buildAddressOptions(MainCardControls& c)
+{
+    QGridLayout* grid = nullptr;
+    QGroupBox* group = groupBox(u"אנשי קשר וכתובת"_s, grid);
+    c.ChkAllContact = checkBox(u"ChkAllContact"_s, u"דיוור נפרד לכל איש קשר?"_s);
+    c.chkUseCntctAddrss = checkBox(u"chkUseCntctAddrss"_s, u"אם כן, עדיפות ראשונה לכתובתו?"_s);
+    c.ChkAddressBySQL = checkBox(u"ChkAddressBySQL"_s, u"כתובת לפי ביטוי SQL:"_s);
+    c.txtSQLAddress = textBox(u"txtSQLAddress"_s);
+    c.txtSQLAddress->setLayoutDirection(Qt::LeftToRight);
+    grid->addWidget(c.ChkAllContact, 0, 0, 1, 2);
+    grid->addWidget(c.chkUseCntctAddrss, 1, 0, 1, 2);
+    grid->addWidget(c.ChkAddressBySQL, 2, 0);
+    grid->addWidget(c.txtSQLAddress, 2, 1);
+    return group;
+}
+
+}  // namespace
+
+QWidget* buildLabelPage(MainCardControls& c)
+{
+    auto* page = new QWidget;
+    auto* columns = new QHBoxLayout(page);
+    columns->addWidget(buildLines(c));
+    auto* side = new QVBoxLayout;
+    side->addWidget(buildPageLayout(c));
+    side->addWidget(buildAddressOptions(c));
+    c.CmdLabDef = button(u"CmdLabDef"_s, u"הגדרות מדבקה"_s);
+    side->addWidget(c.CmdLabDef, 0, Qt::AlignLeading);
+    side->addStretch(1);
+    columns->addLayout(side);
+    return page;
+}
+
+}  // namespace pelmar

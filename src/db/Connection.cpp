@@ -1,0 +1,69 @@
+#include "db/Connection.h"
+
+#include "common/Failure.h"
+#include "common/Messages.h"
+#include "common/SessionState.h"
+#include "db/ConnString.h"
+#include "db/DatabaseClient.h"
+#include "settings/SettingsStore.h"
+
+
+using namespace Qt::StringLiterals;
+
+namespace pelmar {
+
+namespace {
+
+const QString kApp = u"Pelmar"_s;
+const QString kParams = u"Params"_s;
+constexpr int kStartupLoginTimeout = 4;
+constexpr long kIgnoredOpenError = 3022;
+
+}  // namespace
+
+void LoadConnSettings(const SettingsStore& store, SessionState& state)
+{
+    state.ConnServer = store.value(kApp, kParams, u"ConnServer"_s, u"server"_s);
+    state.ConnUID = store.value(kApp, kParams, u"ConnUID"_s, u"sa"_s);
+    state.ConnPWD = store.value(kApp, kParams, u"ConnPWD"_s, {});
+    state.ConnDataBase = store.value(kApp, kParams, u"ConnDataBase"_s, QString::fromUtf16(kUnconfiguredDatabase));
+}
+
+QString configuredSqlServerDriver(const SettingsStore& store)
+{
+    return store.value(kApp, kParams, u"SqlServerDriver"_s, {});
+}
+
+QString companyConnString(const SessionState& state)
+{
+    return BuildConnString(state.ConnServer, state.ConnUID, state.ConnPWD, state.ConnDataBase);
+}
+
+bool TestConnection(const DatabaseClient& client, const SessionState& state, const QString& database)
+{
+    const QString name = database.isEmpty() ? state.ConnDataBase : database;
+    try {
+        client.connect(BuildConnString(state.ConnServer, state.ConnUID, state.ConnPWD, name),
+                       kStartupLoginTimeout);
+    } catch (const Failure& failure) {
+        return failure.number() == kIgnoredOpenError;
+    }
+    return true;
+}
+
+short GetSboVersionLevel(const DatabaseClient& client, const QString& connString, Messages& messages)
+{
+    try {
+        auto versions = client.open(u"SELECT Version FROM CINF"_s, connString);
+        bool numeric = false;
+        const qlonglong version = versions->value(u"Version"_s).toString().trimmed().toLongLong(&numeric);
+        if (!numeric || version < INT32_MIN || version > INT32_MAX)
+            throw Failure(u"Type mismatch: the company database's version is not a number."_s, 13);
+        return version / 1000 >= 62 ? 1 : 0;
+    } catch (const Failure& failure) {
+        messages.critical(u"תקלה"_s, failure.description());
+        return -1;
+    }
+}
+
+}  // namespace pelmar

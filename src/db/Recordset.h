@@ -1,0 +1,52 @@
+#pragma once
+
+#include <QSqlQuery>
+#include <QSqlRecord>
+#include <QString>
+#include <QVariant>
+#include <QVector>
+
+#include <memory>
+
+namespace pelmar {
+
+class DatabaseConnection;
+
+// A forward-only, read-only result of one statement on a connection of its own.
+// After opening it stands on the first row; bof() and eof() are both true when the statement
+// returned no row. moveFirst() runs the statement again for a second pass. Failures throw
+// Failure with the driver's number and description.
+class Recordset {
+public:
+    Recordset(std::unique_ptr<DatabaseConnection> connection, const QString& sql);
+    ~Recordset();
+    Recordset(const Recordset&) = delete;
+    Recordset& operator=(const Recordset&) = delete;
+
+    bool bof() const { return bof_; }
+    bool eof() const { return eof_; }
+    void moveFirst();
+    void moveNext();
+
+    // The column's value on the current row, Null as a null QVariant. The name is matched
+    // without regard to case. Throws Failure at BOF/EOF or for a column the row does not have.
+    QVariant value(const QString& column) const;
+    bool hasColumn(const QString& column) const;
+
+    // Releases the statement and its connection; the recordset then reads as empty.
+    void close();
+
+private:
+    void execute();
+    void readRow();
+
+    std::unique_ptr<DatabaseConnection> connection_;
+    QString sql_;
+    QSqlQuery query_;
+    QSqlRecord record_;
+    QVector<QVariant> row_;
+    bool bof_ = true;
+    bool eof_ = true;
+};
+
+}  // namespace pelmar
