@@ -5,6 +5,7 @@
 #include <QDir>
 #include <QStringList>
 
+#include <algorithm>
 #include <vector>
 
 namespace pelmar {
@@ -112,6 +113,11 @@ bool isFreeTds(const QString& driver)
 
 QString odbcQuoted(const QString& value)
 {
+    static const QString special = QStringLiteral(";{}=");
+    const bool plain = std::none_of(value.begin(), value.end(), [](QChar c) { return special.contains(c); })
+                       && value.trimmed() == value;
+    if (plain)
+        return value;
     QString quoted = value;
     quoted.replace(u'}', QStringLiteral("}}"));
     return u'{' + quoted + u'}';
@@ -152,7 +158,8 @@ QString ConnectionTarget::odbcString(const QString& driver) const
             parts << QStringLiteral("UID=") + odbcQuoted(user) << QStringLiteral("PWD=") + odbcQuoted(password);
         return parts.join(u';');
     }
-    parts << QStringLiteral("DRIVER=") + odbcQuoted(driver);
+    // The driver manager itself reads the braced driver name.
+    parts << QStringLiteral("DRIVER={") + driver + u'}';
     if (isPostgreSql(driver) || isFreeTds(driver)) {
         parts << QStringLiteral("SERVER=") + odbcQuoted(host);
         if (port != 0)

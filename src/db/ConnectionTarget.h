@@ -22,15 +22,17 @@ struct ConnectionTarget {
     // names the embedded engine. Throws Failure for any other string.
     static ConnectionTarget parse(const QString& connString);
 
-    // The ODBC connection string for the given driver. Every value is brace-quoted, so a ";",
-    // "}" or "=" in a password cannot change the string. Not for Embedded targets.
+    // The ODBC connection string for the given driver. Values are brace-quoted where needed,
+    // so a ";", "}" or "=" in a password cannot change the string. Not for Embedded targets.
     QString odbcString(const QString& driver) const;
 
     // The file of the embedded database.
     QString embeddedFile() const;
 };
 
-// Quotes an ODBC attribute value: {value} with every "}" doubled.
+// Quotes an ODBC attribute value that needs it (one holding ";", "{", "}", "=" or leading or
+// trailing blanks): {value} with every "}" doubled. Other values are left as they are, since
+// some drivers take the braces of a plain value literally.
 QString odbcQuoted(const QString& value);
 
 }  // namespace pelmar

@@ -1,0 +1,40 @@
+#include "support/Isolated.h"
+
+#include <QDir>
+#include <QFile>
+
+namespace pelmar::test {
+
+void Isolated::SetUp()
+{
+    ASSERT_TRUE(dir_.isValid());
+    QDir().mkpath(path(QStringLiteral("temp")));
+    savedConfig_ = qgetenv("XDG_CONFIG_HOME");
+    savedTemp_ = qgetenv("Temp");
+    qputenv("XDG_CONFIG_HOME", path(QStringLiteral("config")).toUtf8());
+    qputenv("Temp", path(QStringLiteral("temp")).toUtf8());
+}
+
+void Isolated::TearDown()
+{
+    qputenv("XDG_CONFIG_HOME", savedConfig_);
+    if (savedTemp_.isEmpty())
+        qunsetenv("Temp");
+    else
+        qputenv("Temp", savedTemp_);
+}
+
+QByteArray readFile(const QString& path)
+{
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+void writeFile(const QString& path, const QByteArray& bytes)
+{
+    QFile file(path);
+    if (file.open(QIODevice::WriteOnly | QIODevice::Truncate))
+        file.write(bytes);
+}
+
+}  // namespace pelmar::test

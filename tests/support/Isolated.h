@@ -1,0 +1,33 @@
+#pragma once
+
+#include <QString>
+#include <QTemporaryDir>
+
+#include "support/QtPrinting.h"
+
+#include <gtest/gtest.h>
+
+namespace pelmar::test {
+
+// A test with a folder of its own: the settings store ($XDG_CONFIG_HOME) and the temporary
+// folder (Temp) point into it while the test runs.
+class Isolated : public ::testing::Test {
+protected:
+    void SetUp() override;
+    void TearDown() override;
+
+    QString path(const QString& name) const { return dir_.filePath(name); }
+    QString configFolder() const { return path(QStringLiteral("config/Pelmar")); }
+    QString tempPath(const QString& name) const { return path(QStringLiteral("temp/") + name); }
+
+private:
+    QTemporaryDir dir_;
+    QByteArray savedConfig_;
+    QByteArray savedTemp_;
+};
+
+// Reads a whole file; empty when it cannot be read.
+QByteArray readFile(const QString& path);
+void writeFile(const QString& path, const QByteArray& bytes);
+
+}  // namespace pelmar::test
