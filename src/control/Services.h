@@ -15,7 +15,7 @@ struct Services {
     BrowserWindow& browser;
     FileDialogs& files;
     SettingsStore& settings;
-    DatabaseClient& database;
+    const DatabaseClient& database;
 };
 
 }  // namespace pelmar

@@ -1,7 +1,10 @@
 #include "support/Engines.h"
 
 #include "db/ConnString.h"
+#include "demo/CompanySchema.h"
+#include "demo/SqliteCompanyWriter.h"
 #include "support/PgCluster.h"
+#include "support/PgCopyWriter.h"
 
 #include <QDir>
 #include <QFile>
@@ -48,6 +51,16 @@ public:
         QSqlDatabase::removeDatabase(connection);
     }
 
+    void createCompany(const QString& database, const CompanyOptions& options) override
+    {
+        writeSqliteCompany(QDir(dir_.path()).filePath(database + QStringLiteral(".sqlite")), options);
+    }
+
+    void createCommon(const QList<QPair<QString, QString>>& companies) override
+    {
+        writeSqliteCommon(QDir(dir_.path()).filePath(QStringLiteral("sbo-common.sqlite")), companies);
+    }
+
     QString server() const override { return QStringLiteral("sqlite:") + dir_.path(); }
     QString user() const override { return QStringLiteral("pelmar"); }
     QString password() const override { return {}; }
@@ -66,11 +79,34 @@ public:
         cluster_.createDatabase(database, statements);
     }
 
+    void createCompany(const QString& database, const CompanyOptions& options) override
+    {
+        load(database, companyTables(), [&](RowSink& sink) { generateCompany(options, sink); });
+    }
+
+    void createCommon(const QList<QPair<QString, QString>>& companies) override
+    {
+        load(QStringLiteral("sbo-common"), {companyRegistryTable()}, [&](RowSink& sink) {
+            for (const auto& [database, company] : companies)
+                sink.add(companyRegistryTable(), {database, company, QStringLiteral("9.0")});
+        });
+    }
+
     QString server() const override { return cluster_.server(); }
     QString user() const override { return QLatin1String(PgCluster::kUser); }
     QString password() const override { return QString::fromUtf8(PgCluster::kPassword); }
 
 private:
+    template <typename Fill>
+    void load(const QString& database, const QList<TableSchema>& tables, Fill fill)
+    {
+        QTemporaryDir files;
+        PgCopyWriter writer(files.path());
+        fill(writer);
+        cluster_.createDatabase(database, createStatements(tables) + writer.finish() + indexStatements(tables)
+                                              + QStringList{QStringLiteral("ANALYZE")});
+    }
+
     PgCluster& cluster_;
 };
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "db/DatabaseClient.h"
+#include "demo/CompanyGenerator.h"
 
 #include <QString>
 #include <QStringList>
@@ -21,6 +22,10 @@ public:
 
     // Creates (or replaces) the database and runs the statements in it, one by one.
     virtual void createDatabase(const QString& database, const QStringList& statements) = 0;
+    // Creates (or replaces) a generated company database.
+    virtual void createCompany(const QString& database, const CompanyOptions& options) = 0;
+    // Creates (or replaces) "sbo-common" listing the companies (database name, company name).
+    virtual void createCommon(const QList<QPair<QString, QString>>& companies) = 0;
     // The server, user and password settings that reach the engine.
     virtual QString server() const = 0;
     virtual QString user() const = 0;

@@ -1,0 +1,88 @@
+#include "control/MainCardFixture.h"
+#include "db/ConnString.h"
+#include "log/RunLog.h"
+#include "support/Engines.h"
+
+#include <QApplication>
+#include <QComboBox>
+#include <QDialog>
+#include <QFile>
+#include <QLineEdit>
+#include <QTimer>
+
+using namespace Qt::StringLiterals;
+
+namespace pelmar::test {
+namespace {
+
+class Initialisation : public MainCardTest {
+protected:
+    void pointAt(const QString& database)
+    {
+        for (const auto& [key, value] : {std::pair{u"ConnServer"_s, engine->server()},
+                                         std::pair{u"ConnUID"_s, engine->user()},
+                                         std::pair{u"ConnPWD"_s, engine->password()},
+                                         std::pair{u"ConnDataBase"_s, database}})
+            store->setValue(u"Pelmar"_s, u"Params"_s, key, value);
+    }
+
+    QStringList agents() const
+    {
+        QStringList names;
+        for (int i = 0; i < c().CmbAgent->count(); ++i)
+            names << c().CmbAgent->itemText(i) + u'=' + c().CmbAgent->itemData(i).toString();
+        return names;
+    }
+
+    std::unique_ptr<Engine> engine = makeSqliteEngine();
+};
+
+TEST_F(Initialisation, AConfiguredCompanyFillsTheSalesEmployees)
+{
+    engine->createCompany(u"SBO_Test"_s, CompanyOptions{});
+    pointAt(u"SBO_Test"_s);
+    card->UserControl_Initialize();
+    EXPECT_EQ(agents(), (QStringList{u"-ללא איש מכירות-=-1"_s, u"דנה לוי=1"_s, u"יוסי כהן=2"_s, u"Mark Smith=3"_s,
+                                     u"רונית אברהם=5"_s, u"O'Neil & <Partners>=7"_s}));
+    EXPECT_EQ(c().CmbAgent->currentIndex(), 0) << "the stored agent index 0 is loaded after the list is filled";
+}
+
+TEST_F(Initialisation, TheUnconfiguredDatabaseIsNeverTried)
+{
+    engine->createCompany(u"tarvel02"_s, CompanyOptions{});
+    pointAt(u"tarvel02"_s);
+    card->UserControl_Initialize();
+    EXPECT_EQ(c().CmbAgent->count(), 0);
+}
+
+TEST_F(Initialisation, AnUnreachableCompanyLeavesTheControlUsable)
+{
+    pointAt(u"nosuchcompany"_s);
+    card->UserControl_Initialize();
+    EXPECT_EQ(c().CmbAgent->count(), 0);
+    EXPECT_TRUE(messages.boxes.isEmpty());
+    EXPECT_EQ(c().txtRows->text(), u"8"_s);
+}
+
+TEST_F(Initialisation, ClosingTheLogonDialogReloadsTheStoredSettingsAndEmptiesTheLog)
+{
+    card->UserControl_Initialize();
+    c().txtRows->setText(u"99"_s);
+    WriteLog(u"SELECT 1"_s, u"t"_s);
+    QTimer closer;
+    QString seenTitle;
+    QObject::connect(&closer, &QTimer::timeout, [&] {
+        if (auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget())) {
+            seenTitle = dialog->windowTitle();
+            dialog->reject();
+        }
+    });
+    closer.start(10);
+    card->CmdConnect_Click();
+    EXPECT_EQ(seenTitle, u"Connect to SAP Business One"_s);
+    EXPECT_EQ(c().txtRows->text(), u"8"_s);
+    EXPECT_FALSE(QFile::exists(runLogPath()));
+}
+
+}  // namespace
+}  // namespace pelmar::test

@@ -1,0 +1,90 @@
+#include "common/SessionState.h"
+#include "db/Connection.h"
+#include "support/Engines.h"
+#include "support/Fakes.h"
+#include "support/PgCluster.h"
+
+#include <QElapsedTimer>
+
+using namespace Qt::StringLiterals;
+
+namespace pelmar::test {
+namespace {
+
+class ConnectionTest : public ::testing::TestWithParam<EngineFactory> {
+protected:
+    void SetUp() override { engine = GetParam()(); }
+
+    short levelOf(const QStringList& statements)
+    {
+        engine->createDatabase(u"versiontest"_s, statements);
+        return GetSboVersionLevel(engine->client(), engine->connString(u"versiontest"_s), messages);
+    }
+
+    SessionState stateFor(const QString& database) const
+    {
+        SessionState state;
+        state.ConnServer = engine->server();
+        state.ConnUID = engine->user();
+        state.ConnPWD = engine->password();
+        state.ConnDataBase = database;
+        return state;
+    }
+
+    std::unique_ptr<Engine> engine;
+    FakeMessages messages;
+};
+
+TEST_P(ConnectionTest, TheSchemaLevelFollowsTheVersionInThousands)
+{
+    const std::pair<int, short> cases[] = {{900045, 1}, {62001, 1}, {61999, 0}, {60100, 0}, {59000, 0}};
+    for (const auto& [version, level] : cases) {
+        EXPECT_EQ(levelOf({u"CREATE TABLE CINF (Version INTEGER)"_s, u"INSERT INTO CINF VALUES (%1)"_s.arg(version)}),
+                  level)
+            << version;
+    }
+    EXPECT_TRUE(messages.boxes.isEmpty());
+}
+
+TEST_P(ConnectionTest, AnUnreadableVersionGivesMinusOneAndTheCriticalMessage)
+{
+    EXPECT_EQ(levelOf({u"CREATE TABLE OCRD (CardCode VARCHAR(15))"_s}), -1);
+    ASSERT_EQ(messages.boxes.size(), 1);
+    EXPECT_EQ(messages.boxes[0].kind, u"critical"_s);
+    EXPECT_EQ(messages.boxes[0].title, u"תקלה"_s);
+    EXPECT_TRUE(messages.boxes[0].text.contains(u"cinf"_s, Qt::CaseInsensitive)) << messages.boxes[0];
+
+    messages.boxes.clear();
+    EXPECT_EQ(levelOf({u"CREATE TABLE CINF (Version VARCHAR(10))"_s, u"INSERT INTO CINF VALUES ('nine')"_s}), -1);
+    EXPECT_EQ(messages.boxes.size(), 1);
+}
+
+TEST_P(ConnectionTest, TheStartUpTestOpensTheSavedCompanyOrAnotherNamedOne)
+{
+    engine->createDatabase(u"company1"_s, {u"CREATE TABLE OCRD (CardCode VARCHAR(15))"_s});
+    const SessionState state = stateFor(u"company1"_s);
+    EXPECT_TRUE(TestConnection(engine->client(), state, QString()));
+    EXPECT_TRUE(TestConnection(engine->client(), stateFor(u"other"_s), u"company1"_s));
+    EXPECT_FALSE(TestConnection(engine->client(), state, u"nosuchcompany"_s));
+}
+
+INSTANTIATE_TEST_SUITE_P(Engines, ConnectionTest, ::testing::Values(&makeSqliteEngine, &makePostgresEngine),
+                         engineName);
+
+TEST(StartUpTest, AServerThatNeverAnswersIsGivenUpAfterFourSeconds)
+{
+    SilentServer silent;
+    SessionState state;
+    state.ConnServer = u"127.0.0.1,%1"_s.arg(silent.port());
+    state.ConnUID = u"sa"_s;
+    state.ConnDataBase = u"SBO"_s;
+    const DatabaseClient client(QLatin1String(PgCluster::kDriver));
+    QElapsedTimer timer;
+    timer.start();
+    EXPECT_FALSE(TestConnection(client, state, QString()));
+    EXPECT_GE(timer.elapsed(), 3500);
+    EXPECT_LT(timer.elapsed(), 8000);
+}
+
+}  // namespace
+}  // namespace pelmar::test
