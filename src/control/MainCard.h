@@ -2,7 +2,9 @@
 
 #include "control/MainCardControls.h"
 #include "control/Services.h"
+#include "selection/Criteria.h"
 
+#include <QDate>
 #include <QString>
 #include <QWidget>
 
@@ -32,6 +34,22 @@ public:
     // Refills CmbAgent from OSLP (item data = SlpCode); on any failure, or when OSLP is empty,
     // the list keeps what it has.
     void FillCmbAgent();
+
+    // The recipient query. BuildWhere throws Failure naming a criterion that cannot be read.
+    Criteria criteria() const;
+    QString BuildWhere() const;
+    QString BuildSelect(int pDocIndex, bool pAllDetails, short pOutType) const;
+    QString BuildOrderBy(int pDocIndex, short pOutType) const;
+    QString BuildDatesCriteria(const QDate& pFromDate, const QDate& pToDate, int pDocIndex, int pDocRelation,
+                               const QString& pFromDocNum, const QString& pToDocNum) const;
+    QString BuildItemsCriteria(const QString& pFromItem, const QString& pToItem) const;
+    QString BuildQryGroupCriteria() const;
+    // BuildSelect + BuildWhere (+ BuildOrderBy when ordered) with the chosen document type.
+    QString recipientStatement(short pOutType, bool pAllDetails, bool ordered) const;
+
+    // The selected-card list: the test and whether the outputs filter by it now.
+    bool IsSelectedCard(const QString& pCardCode) const;
+    bool selectionFilter() const;
 
     // 1 when the WinFax option is chosen, else 2 for the fax service, else 0.
     short GetOLEOption() const;

@@ -1,0 +1,218 @@
+#include "common/Failure.h"
+#include "common/SessionState.h"
+#include "selection/Criteria.h"
+#include "selection/DateText.h"
+#include "selection/DocTypes.h"
+#include "selection/SelectBuilder.h"
+#include "selection/SelectedCards.h"
+#include "selection/WhereBuilder.h"
+#include "support/QtPrinting.h"
+
+#include <gtest/gtest.h>
+
+using namespace Qt::StringLiterals;
+
+namespace pelmar::test {
+namespace {
+
+TEST(StatementText, TheDocumentedExamplesComeOutByteForByte)
+{
+    SessionState state;
+    Criteria groups;
+    groups.catCode = true;
+    groups.cardType = 0;
+    state.SelCardGroups = {CardGroupSel{}, CardGroupSel{100, true}, CardGroupSel{101, false}, CardGroupSel{103, true}};
+    EXPECT_EQ(BuildWhere(groups, state), u" Where (1 > 0) AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s);
+
+    EXPECT_EQ(BuildDatesCriteria(QDate(2005, 3, 1), QDate(2005, 3, 31), 0, 0, u"1000"_s, {}),
+              u" AND OINV.DocDate Between '03/01/2005' And '03/31/2005' And OINV.DocNum>=1000"_s);
+
+    state.QryGroupSel[3] = state.QryGroupSel[17] = true;
+    state.QryGroupRelation = u"OR"_s;
+    EXPECT_EQ(BuildQryGroupCriteria(state), u" And (OCRD.QryGroup3='Y' OR OCRD.QryGroup17='Y')"_s);
+
+    Criteria labels;
+    labels.addressFrom = 0;
+    labels.deptTag = u"0"_s;
+    EXPECT_EQ(BuildSelect(labels, 0, 0, true, kLabels),
+              u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.MailAddres, OCRD.MailCounty, OCRD.MailCity, "
+              "OCRD.MailZipCod, OCPR.Name Attn, OCPR.Notes1 Department, OCPR.Address CntctAddrs, '' MailBlock, "
+              "'' MailState, OCRD.MailCountr MailCountry FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = "
+              "OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
+
+    labels.sortBy = 4;
+    EXPECT_EQ(BuildOrderBy(labels, 0, 0, kLabels), u" ORDER BY OCPR.Name ASC, OCRD.MailZipCod ASC"_s);
+}
+
+struct WhereCase {
+    const char* name;
+    std::function<void(Criteria&, SessionState&)> set;
+    QString expected;
+};
+
+TEST(StatementText, EachCriterionAddsItsFragmentInOrder)
+{
+    const WhereCase cases[] = {
+        {"nothing on", [](Criteria&, SessionState&) {}, u" Where (1 > 0)"_s},
+        {"type without groups", [](Criteria& c, SessionState&) { c.catCode = true; c.cardType = 1; },
+         u" Where (1 > 0) AND OCRD.CardType = 'S'"_s},
+        {"no type chosen", [](Criteria& c, SessionState&) { c.catCode = true; c.cardType = -1; },
+         u" Where (1 > 0) AND OCRD.CardType = 'All'"_s},
+        {"leads", [](Criteria& c, SessionState&) { c.catCode = true; c.cardType = 2; },
+         u" Where (1 > 0) AND OCRD.CardType = 'L'"_s},
+        {"code range with apostrophes", [](Criteria& c, SessionState&) { c.codeRange = true; c.fromCard = u"C'01"_s; c.toCard = u"C'09"_s; },
+         u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'C''01' And N'C''09'"_s},
+        {"empty code range", [](Criteria& c, SessionState&) { c.codeRange = true; },
+         u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'' And N''"_s},
+        {"city of the mailing address", [](Criteria& c, SessionState&) { c.city = true; c.cityPrefix = u"קריית"_s; c.addressFrom = 0; },
+         u" Where (1 > 0) AND OCRD.MailCity LIKE N'קריית%'"_s},
+        {"city of the card address", [](Criteria& c, SessionState&) { c.city = true; c.cityPrefix = u"ב'"_s; c.addressFrom = 1; },
+         u" Where (1 > 0) AND OCRD.City LIKE N'ב''%'"_s},
+        {"phone 2", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = 1; c.phonePrefix = u"03"_s; },
+         u" Where (1 > 0) AND OCRD.Phone2 LIKE N'03%'"_s},
+        {"mobile", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = 2; c.phonePrefix = u"05"_s; },
+         u" Where (1 > 0) AND OCRD.Cellular LIKE N'05%'"_s},
+        {"fax", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = 3; c.phonePrefix = u"04"_s; },
+         u" Where (1 > 0) AND OCRD.Fax LIKE N'04%'"_s},
+        {"contact mobile", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = 4; c.phonePrefix = u"052"_s; },
+         u" Where (1 > 0) AND OCPR.Cellolar LIKE N'052%'"_s},
+        {"no phone type", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = -1; },
+         u" Where (1 > 0) AND OCRD.Phone1 LIKE N'%'"_s},
+        {"sales employee", [](Criteria& c, SessionState&) { c.agent = true; c.agentCode = -1; },
+         u" Where (1 > 0) AND OCRD.SlpCode = -1"_s},
+        {"documents present", [](Criteria& c, SessionState&) { c.dates = true; c.fromDate = u"31/12/99"_s; c.toDate = u"1/1/00"_s; c.docType = 2; c.toDocNum = u"77"_s; },
+         u" Where (1 > 0) AND ODLN.DocDate Between '12/31/1999' And '01/01/2000' And ODLN.DocNum<=77"_s},
+        {"checks absent", [](Criteria& c, SessionState&) { c.dates = true; c.fromDate = u"15/6/2004"_s; c.toDate = u"5/3/05"_s; c.docType = 6; c.byDoc = 1; },
+         u" Where (1 > 0) AND OCRD.CardCode Not In (Select Distinct VendorCode From OCHO Where OCHO.PmntDate Between '06/15/2004' And '03/05/2005')"_s},
+        {"documents with no relation", [](Criteria& c, SessionState&) { c.dates = true; c.fromDate = c.toDate = u"1/1/05"_s; c.byDoc = -1; },
+         u" Where (1 > 0)"_s},
+        {"items", [](Criteria& c, SessionState&) { c.items = true; c.fromItem = u"A'1"_s; c.toItem = u"B"_s; },
+         u" Where (1 > 0) AND (OCRD.CardCode IN (SELECT CardCode FROM OINV, INV1 Where INV1.DocEntry = OINV.DocEntry And INV1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode) OR OCRD.CardCode IN (SELECT CardCode FROM ORIN, RIN1 Where RIN1.DocEntry = ORIN.DocEntry And RIN1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode))"_s},
+        {"properties none chosen", [](Criteria& c, SessionState&) { c.properties = true; },
+         u" Where (1 > 0) And (1>0)"_s},
+        {"properties default AND", [](Criteria& c, SessionState& s) { c.properties = true; s.QryGroupSel[1] = s.QryGroupSel[64] = true; },
+         u" Where (1 > 0) And (OCRD.QryGroup1='Y' AND OCRD.QryGroup64='Y')"_s},
+        {"free SQL empty", [](Criteria& c, SessionState&) { c.sqlWhere = true; },
+         u" Where (1 > 0)"_s},
+        {"free SQL as typed", [](Criteria& c, SessionState&) { c.sqlWhere = true; c.sqlWhereText = u"OCRD.Notes LIKE 'x%'"_s; },
+         u" Where (1 > 0) And OCRD.Notes LIKE 'x%'"_s},
+    };
+    for (const WhereCase& c : cases) {
+        Criteria criteria;
+        SessionState state;
+        c.set(criteria, state);
+        EXPECT_EQ(BuildWhere(criteria, state), c.expected) << c.name;
+    }
+}
+
+TEST(StatementText, ACriterionThatCannotBeReadIsNamedInsteadOfBreakingTheStatement)
+{
+    const std::pair<std::function<void(Criteria&)>, QString> cases[] = {
+        {[](Criteria& c) { c.agent = true; }, u"סוכן"_s},
+        {[](Criteria& c) { c.dates = true; c.fromDate = u"yesterday"_s; c.toDate = u"1/1/05"_s; }, u"yesterday"_s},
+        {[](Criteria& c) { c.dates = true; c.fromDate = u"1/1/05"_s; c.toDate = u"1/1/05"_s; c.fromDocNum = u"1; DROP TABLE OCRD"_s; },
+         u"1; DROP TABLE OCRD"_s},
+        {[](Criteria& c) { c.dates = true; c.fromDate = u"1/1/05"_s; c.toDate = u"1/1/05"_s; c.toDocNum = u"12.5"_s; }, u"12.5"_s},
+    };
+    for (const auto& [set, named] : cases) {
+        Criteria criteria;
+        set(criteria);
+        try {
+            BuildWhere(criteria, SessionState{});
+            ADD_FAILURE() << named.toStdString();
+        } catch (const Failure& failure) {
+            EXPECT_TRUE(failure.description().contains(named)) << failure.description().toStdString();
+        }
+    }
+}
+
+TEST(StatementText, DatesAreReadDayFirstWithTwoDigitYearsAndRollOver)
+{
+    EXPECT_EQ(DateFromText(u"31/12/99"_s), QDate(1999, 12, 31));
+    EXPECT_EQ(DateFromText(u"1/1/00"_s), QDate(2000, 1, 1));
+    EXPECT_EQ(DateFromText(u"15/6/2004"_s), QDate(2004, 6, 15));
+    EXPECT_EQ(DateFromText(u"5/3/05"_s), DateFromText(u"05/03/2005"_s));
+    EXPECT_EQ(DateFromText(u"01/01/79"_s), QDate(2079, 1, 1));
+    EXPECT_EQ(DateFromText(u"32/12/2004"_s), QDate(2005, 1, 1));
+    EXPECT_EQ(DateFromText(u"1/13/2004"_s), QDate(2005, 1, 1));
+    EXPECT_THROW(DateFromText(u"2004-06-15"_s), Failure);
+    EXPECT_THROW(DateFromText(QString()), Failure);
+}
+
+TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
+{
+    Criteria c;
+    EXPECT_EQ(BuildSelect(c, 1, 0, false, kCardList),
+              u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
+    c.allContacts = true;
+    c.addressFrom = 1;
+    c.deptTag = u"1"_s;
+    EXPECT_EQ(BuildSelect(c, 1, 0, true, kLetters),
+              u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Address MailAddres, OCRD.County MailCounty, OCRD.City MailCity, OCRD.ZipCode MailZipCod, OCPR.Name Attn, OCPR.Position Department, OCPR.Address As CntctAddrs, OCRD.Block MailBlock, OCST.Name MailState, OCRY.Name MailCountry FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode )"
+              " LEFT JOIN OCRY ON (OCRY.Code = OCRD.Country) LEFT JOIN OCST ON (OCST.Code = OCRD.State1 AND OCST.Country = OCRD.Country)"_s);
+
+    Criteria checks;
+    checks.dates = true;
+    checks.fromDate = checks.toDate = u"1/1/05"_s;
+    checks.docType = 6;
+    checks.addressBySql = true;
+    checks.sqlAddress = u"OCRD.Notes"_s;
+    EXPECT_EQ(BuildSelect(checks, -1, 6, true, kLabels),
+              u"SELECT DISTINCT OCRD.CardCode, OCHO.VendorName As CardName, OCRD.Notes As MailAddres, '' MailCounty, '' MailCity, '' MailZipCod, OCPR.Name Attn, OCPR.Notes1 Department, OCPR.Address As CntctAddrs FROM (OCRD INNER JOIN OCHO ON OCRD.CardCode = OCHO.VendorCode) LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn)"_s);
+    checks.sortBy = 1;
+    EXPECT_EQ(BuildOrderBy(checks, -1, 6, kLabels), u" ORDER BY OCHO.VendorName ASC"_s)
+        << "the name key is the column the list takes the name from";
+
+    Criteria fax;
+    fax.mergeExpressions = {{u"OCRD.Phone2"_s, u"Field4"_s}};
+    EXPECT_EQ(BuildSelect(fax, 1, 0, false, kFax),
+              u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Fax, OCRD.Phone1, OCPR.Name AS Attn, OCPR.Name AS CName, OCPR.Fax AS CFax, OCPR.Position, OCPR.Notes1, OCPR.Notes2, OCRD.Phone2 As Field4 FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
+    EXPECT_FALSE(BuildSelect(fax, 1, 0, false, kEmail).contains(u"Field4"_s));
+    EXPECT_TRUE(BuildSelect(Criteria{}, 1, 0, false, 7).startsWith(u" FROM OCRD"_s));
+}
+
+TEST(StatementText, ASortKeyOutsideTheListIsSelectedSoTheDatabaseAcceptsTheOrder)
+{
+    Criteria c;
+    c.sortBy = 2;
+    c.addressFrom = 0;
+    EXPECT_TRUE(BuildSelect(c, 1, 0, false, kCardList).contains(u", OCRD.MailCity AS SortKey1 FROM"_s));
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, kCardList), u" ORDER BY SortKey1 ASC"_s);
+    EXPECT_FALSE(BuildSelect(c, 1, 0, true, kLabels).contains(u"SortKey"_s));
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, kLabels), u" ORDER BY OCRD.MailCity ASC"_s);
+
+    c.sortBy = 5;
+    c.sortDir = -1;
+    EXPECT_TRUE(BuildSelect(c, 1, 0, true, kLabels).contains(u", OCPR.Cellolar AS SortKey1, OCRD.Cellular AS SortKey2 FROM"_s));
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, kLabels), u" ORDER BY SortKey1 , SortKey2 "_s);
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, kMobiles), u" ORDER BY OCPR.Cellolar , OCRD.Cellular "_s);
+}
+
+TEST(SelectedCards, TheListIsExactCaseSensitiveAndKeepsDuplicates)
+{
+    SessionState state;
+    EXPECT_FALSE(IsSelectedCard(state, u"C0001"_s));
+    EXPECT_FALSE(selectionFilterOn(state, true)) << "an empty list filters nothing";
+    replaceSelectedCards(state, {u"C0001"_s, u"C0002"_s, u"C0001"_s});
+    EXPECT_EQ(state.WantedCrdCount(), 3);
+    EXPECT_TRUE(IsSelectedCard(state, u"C0002"_s));
+    EXPECT_FALSE(IsSelectedCard(state, u"c0001"_s));
+    EXPECT_FALSE(IsSelectedCard(state, u"C0001 "_s));
+    EXPECT_TRUE(selectionFilterOn(state, true));
+    EXPECT_FALSE(selectionFilterOn(state, false));
+    replaceSelectedCards(state, {});
+    EXPECT_FALSE(selectionFilterOn(state, true));
+}
+
+TEST(DocTypes, CardTypeLettersAndDocumentTables)
+{
+    EXPECT_EQ(CardTypeCode(2, true), u"C"_s);
+    EXPECT_EQ(CardTypeCode(2, false), u"L"_s);
+    EXPECT_EQ(CardTypeCode(3, false), u"All"_s);
+    EXPECT_EQ(GetDocTypeInfo(8).DateField, u"PayDate"_s);
+    EXPECT_FALSE(GetDocTypeInfo(8).HasContact);
+    EXPECT_EQ(GetDocTypeInfo(42).TableName, u"OINV"_s);
+}
+
+}  // namespace
+}  // namespace pelmar::test
