@@ -225,3 +225,32 @@ TEST_F(MainCardTest, InitialisationLoadsTheOptionsAndShowsTheCriteriaPage)
 
 }  // namespace
 }  // namespace pelmar::test
+
+namespace pelmar::test {
+namespace {
+
+TEST_F(MainCardTest, TheStatementIsBuiltFromWhatThePagesHold)
+{
+    card->SetGetRegParams(kLoad);
+    c().ChkCity->setChecked(true);
+    c().TxtCity->setText(u"חי"_s);
+    c().cmbAddressFrom->setCurrentIndex(1);
+    c().CmbAgent->addItem(u"דנה"_s, 7);
+    c().ChkAgent->setChecked(true);
+    c().CmbAgent->setCurrentIndex(0);
+    c().chkFaxField[5]->setChecked(true);
+    c().txtFaxExpr[5]->setText(u"OCRD.Notes"_s);
+    EXPECT_EQ(card->BuildWhere(), u" Where (1 > 0) AND OCRD.City LIKE N'חי%' AND OCRD.SlpCode = 7"_s);
+    EXPECT_TRUE(card->BuildSelect(0, false, 3).contains(u", OCRD.Notes As Field5 FROM"_s));
+    EXPECT_EQ(card->recipientStatement(1, false, true),
+              card->BuildSelect(0, false, 1) + card->BuildWhere() + card->BuildOrderBy(0, 1));
+
+    state.WantedCrd = {u"C1"_s};
+    EXPECT_FALSE(card->selectionFilter());
+    c().ChkSelectAccount->setChecked(true);
+    EXPECT_TRUE(card->selectionFilter());
+    EXPECT_TRUE(card->IsSelectedCard(u"C1"_s));
+}
+
+}  // namespace
+}  // namespace pelmar::test
