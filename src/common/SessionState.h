@@ -14,6 +14,17 @@ struct CardGroupSel {
     bool Selected = false;
 };
 
+// The style of one label line. Fields are 0..255; the fixed text is used by lines 11 and 12.
+struct LabelDefRec {
+    unsigned char Font = 0;        // 0 Arial, 1 David, 2 Miriam
+    unsigned char FontSize = 0;    // points
+    unsigned char FontWeight = 0;  // 0 Normal, 1 Bolder, 2 Bold
+    unsigned char FontUL = 0;      // 1 underlined
+    unsigned char FontItalic = 0;  // 1 italic
+    QString FixedText;
+    bool operator==(const LabelDefRec&) const = default;
+};
+
 // The state the control's parts share for the life of the process: the connection settings,
 // the schema level, the stop flag, the hand-picked cards and the picker selections.
 // One instance is made by the program and handed to the control and its dialogs; tests make
@@ -44,6 +55,9 @@ struct SessionState {
     // Properties 1..64 (index 0 unused) and how they combine ("AND", "OR", or "" for AND).
     std::array<bool, 65> QryGroupSel{};
     QString QryGroupRelation;
+
+    // Styles of the thirteen label lines; line 6 (department) always equals line 3 (contact).
+    std::array<LabelDefRec, 13> LabelDefs{};
 
     int WantedCrdCount() const { return static_cast<int>(WantedCrd.size()); }
     void clearCardGroups() { SelCardGroups = {CardGroupSel{}}; }

@@ -9,6 +9,7 @@
 #include "control/Tag.h"
 #include "control/pages/Pages.h"
 #include "db/ui/LogonDialog.h"
+#include "outputs/ui/LabelStyleDialog.h"
 
 #include <QComboBox>
 #include <QCoreApplication>
@@ -56,6 +57,7 @@ void MainCard::connectHandlers()
     connect(c_.CmdDef, &QPushButton::clicked, this, &MainCard::CmdDef_Click);
     connect(c_.cmdStop, &QPushButton::clicked, this, &MainCard::cmdStop_Click);
     connect(c_.CmdConnect, &QPushButton::clicked, this, &MainCard::CmdConnect_Click);
+    connect(c_.CmdLabDef, &QPushButton::clicked, this, &MainCard::CmdLabDef_Click);
     connect(c_.LblDept, &ClickableLabel::clicked, this, &MainCard::LblDept_Click);
     connect(c_.Label56, &ClickableLabel::doubleClicked, this, &MainCard::Label56_DblClick);
     for (int i = 1; i <= 3; ++i)
@@ -86,6 +88,12 @@ void MainCard::CmdConnect_Click()
 {
     showLogonDialog(services_, state_, this);
     UserControl_Initialize();
+}
+
+void MainCard::CmdLabDef_Click()
+{
+    LabelStyleDialog dialog(services_.settings, state_.LabelDefs, this);
+    dialog.exec();
 }
 
 void MainCard::cmdStop_Click()

@@ -2,6 +2,7 @@
 
 #include "control/MainCardControls.h"
 #include "control/Services.h"
+#include "outputs/LabelSheet.h"
 #include "selection/Criteria.h"
 
 #include <QDate>
@@ -51,6 +52,13 @@ public:
     bool IsSelectedCard(const QString& pCardCode) const;
     bool selectionFilter() const;
 
+    // The label run: writes "pelmar1.htm" in the temporary folder and opens it in a new browser
+    // window. CreateLabFile writes the sheet to a path; false when the schema level could not be
+    // read (already reported) and nothing was written. Both throw Failure with the description
+    // the user sees; a layout box without a valid number fails before the file is touched.
+    void RunLabels();
+    bool CreateLabFile(const QString& pFileName);
+
     // 1 when the WinFax option is chosen, else 2 for the fax service, else 0.
     short GetOLEOption() const;
 
@@ -59,6 +67,7 @@ public:
     void CmdPreview_Click();
     void CmdDef_Click();
     void cmdStop_Click();
+    void CmdLabDef_Click();
     void CmdConnect_Click();
     void CmdDir_Click(int index);
     void LblDept_Click();
@@ -80,6 +89,8 @@ private:
     struct OutputType;
     static const OutputType& outputTypeAt(int listIndex);
 
+    LabelPage labelPage() const;
+    bool readSchemaLevel(QString& connString);
     void buildPages();
     void connectHandlers();
     void showDeptCaption();

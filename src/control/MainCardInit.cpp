@@ -4,6 +4,7 @@
 #include "control/SetGetCtrl.h"
 #include "db/Connection.h"
 #include "log/RunLog.h"
+#include "outputs/LabelStyles.h"
 #include "selection/SalesEmployees.h"
 
 #include <QComboBox>
@@ -40,6 +41,7 @@ void MainCard::UserControl_Initialize()
             FillCmbAgent();
     });
     ignoringFailure([&] { SetGetRegParams(kLoad); });
+    ignoringFailure([&] { SetGetLabelDefs(kLoad, services_.settings, state_.LabelDefs); });
     ignoringFailure([&] { state_.CardListSQL.clear(); });
     ignoringFailure([&] { state_.clearCardGroups(); });
     ignoringFailure([&] { showDeptCaption(); });

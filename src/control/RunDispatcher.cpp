@@ -21,7 +21,7 @@ struct MainCard::OutputType {
 const MainCard::OutputType& MainCard::outputTypeAt(int listIndex)
 {
     static const OutputType types[] = {
-        {u"מדבקות למעטפות"_s, u"להתחיל בהכנת המדבקות?"_s, {}, {}},
+        {u"מדבקות למעטפות"_s, u"להתחיל בהכנת המדבקות?"_s, {}, &MainCard::RunLabels},
         {u"מכתבים בפקס"_s, u"להתחיל במשלוח הפקסים?"_s, u"משלוח הפקסים הסתיים"_s, {}},
         {u"דואר אלקטרוני"_s, u"להתחיל במשלוח דואר אלקטרוני?"_s, u"הדיוור האלקטרוני הסתיים"_s, {}},
         {u"לטלפונים סלולריים"_s, u"להתחיל בהכנת קובץ למשלוח הודעות לסלולריים?"_s, {}, {}},

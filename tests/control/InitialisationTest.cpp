@@ -1,4 +1,4 @@
-#include "control/MainCardFixture.h"
+#include "support/MainCardFixture.h"
 #include "db/ConnString.h"
 #include "log/RunLog.h"
 #include "support/Engines.h"

@@ -1,5 +1,5 @@
 #include "control/ClickableLabel.h"
-#include "control/MainCardFixture.h"
+#include "support/MainCardFixture.h"
 #include "control/SetGetCtrl.h"
 #include "control/Tag.h"
 

@@ -1,7 +1,7 @@
 #include "control/ClickableLabel.h"
 #include "control/SetGetCtrl.h"
 #include "control/Tag.h"
-#include "control/MainCardFixture.h"
+#include "support/MainCardFixture.h"
 
 #include <QCheckBox>
 #include <QComboBox>

@@ -1,0 +1,69 @@
+#pragma once
+
+#include "db/ConnString.h"
+#include "support/CompanyRows.h"
+#include "support/Engines.h"
+#include "support/MainCardFixture.h"
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QLineEdit>
+
+namespace pelmar::test {
+
+// Five cards written by hand, on the embedded engine, for byte-exact outputs:
+// C1 Hebrew with a contact and a contact address; C2 English with "&" and "<" in its name;
+// C3 a 40-character name, no mailing address, a Hebrew city; C4 no address at all; C5 no contact.
+inline QStringList labelCards()
+{
+    const auto card = [](QVariantMap values) { return insertRow(QStringLiteral("OCRD"), values); };
+    const auto contact = [](QVariantMap values) { return insertRow(QStringLiteral("OCPR"), values); };
+    using namespace Qt::StringLiterals;
+    return {
+        insertRow(u"OCRY"_s, {{u"Code"_s, u"IL"_s}, {u"Name"_s, u"ישראל"_s}}),
+        card({{u"CardCode"_s, u"C1"_s}, {u"CardName"_s, u"אבג בע\"מ"_s}, {u"CardType"_s, u"C"_s}, {u"CntctPrsn"_s, u"משה"_s},
+              {u"MailAddres"_s, u"הרצל 1"_s}, {u"MailCity"_s, u"חיפה"_s}, {u"MailZipCod"_s, u"12345"_s},
+              {u"MailBlock"_s, u"גוש 5"_s}, {u"MailCounty"_s, u"צפון"_s}, {u"MailCountr"_s, u"IL"_s},
+              {u"Cellular"_s, u"050-123"_s}}),
+        contact({{u"CntctCode"_s, 1}, {u"CardCode"_s, u"C1"_s}, {u"Name"_s, u"משה"_s}, {u"Notes1"_s, u"רכש"_s},
+                 {u"Position"_s, u"מנהל"_s}, {u"Address"_s, u"רחוב הגפן 5,עכו"_s}}),
+        card({{u"CardCode"_s, u"C2"_s}, {u"CardName"_s, u"Smith & <Sons>"_s}, {u"CardType"_s, u"C"_s},
+              {u"CntctPrsn"_s, u"ABC"_s}, {u"MailAddres"_s, u"12 Main St"_s}, {u"MailCity"_s, u"Springfield"_s},
+              {u"MailZipCod"_s, u"999"_s}}),
+        contact({{u"CntctCode"_s, 2}, {u"CardCode"_s, u"C2"_s}, {u"Name"_s, u"ABC"_s}, {u"Notes1"_s, u"DEF"_s},
+                 {u"Address"_s, u"PO 5"_s}}),
+        card({{u"CardCode"_s, u"C3"_s}, {u"CardName"_s, u"ABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789abcd"_s},
+              {u"CardType"_s, u"S"_s}, {u"MailCity"_s, u"תל אביב"_s}}),
+        card({{u"CardCode"_s, u"C4"_s}, {u"CardName"_s, u"Null Address Co"_s}, {u"CardType"_s, u"C"_s}}),
+        card({{u"CardCode"_s, u"C5"_s}, {u"CardName"_s, u"חמש"_s}, {u"CardType"_s, u"L"_s}, {u"MailCity"_s, u"עכו"_s},
+              {u"MailZipCod"_s, u"55"_s}}),
+    };
+}
+
+// A control connected to the hand-made company, with its options loaded.
+class LabelCompanyTest : public MainCardTest {
+protected:
+    void SetUp() override
+    {
+        MainCardTest::SetUp();
+        engine->createDatabase(QStringLiteral("labels"), handMadeCompany(900000, labelCards()));
+        state.ConnServer = engine->server();
+        state.ConnUID = engine->user();
+        state.ConnDataBase = QStringLiteral("labels");
+        card->SetGetRegParams(2);
+        c().cmbAddressFrom->setCurrentIndex(0);
+    }
+
+    // Ticks exactly the given label lines.
+    void lines(std::initializer_list<int> enabled)
+    {
+        for (QCheckBox* box : c().ChkTitle)
+            box->setChecked(false);
+        for (int line : enabled)
+            c().ChkTitle[line]->setChecked(true);
+    }
+
+    std::unique_ptr<Engine> engine = makeSqliteEngine();
+};
+
+}  // namespace pelmar::test
