@@ -36,6 +36,11 @@ void appendReference(QByteArray& out, char32_t code, bool html)
 
 }  // namespace
 
+unsigned char windows1255Byte(char16_t unit)
+{
+    return unit < 0x80 ? static_cast<unsigned char>(unit) : encodingTable()[unit];
+}
+
 QByteArray toWindows1255(const QString& text, bool html)
 {
     const auto& table = encodingTable();

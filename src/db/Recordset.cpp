@@ -24,6 +24,7 @@ void Recordset::execute()
     if (!query_.exec(sql_))
         throw failureOf(query_.lastError());
     record_ = query_.record();
+    positions_.clear();
     readRow();
     bof_ = eof_;
 }
@@ -60,9 +61,20 @@ void Recordset::moveNext()
     readRow();
 }
 
+// Callers ask for the same few names row after row, so each name's position is remembered.
+int Recordset::indexOf(const QString& column) const
+{
+    const auto known = positions_.constFind(column);
+    if (known != positions_.constEnd())
+        return *known;
+    const int index = record_.indexOf(column);
+    positions_.insert(column, index);
+    return index;
+}
+
 bool Recordset::hasColumn(const QString& column) const
 {
-    return connection_ && record_.indexOf(column) >= 0;
+    return connection_ && indexOf(column) >= 0;
 }
 
 QVariant Recordset::value(const QString& column) const
@@ -70,7 +82,7 @@ QVariant Recordset::value(const QString& column) const
     if (eof_)
         throw Failure(QStringLiteral("Either BOF or EOF is True, or the current record has been deleted."),
                       3021);
-    const int index = record_.indexOf(column);
+    const int index = indexOf(column);
     if (index < 0 || index >= row_.size())
         throw Failure(QStringLiteral("Item cannot be found in the collection corresponding to the "
                                      "requested name or ordinal (%1).").arg(column),

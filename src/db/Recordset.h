@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QHash>
 #include <QSqlQuery>
 #include <QSqlRecord>
 #include <QString>
@@ -32,6 +33,10 @@ public:
     // without regard to case. Throws Failure at BOF/EOF or for a column the row does not have.
     QVariant value(const QString& column) const;
     bool hasColumn(const QString& column) const;
+    // The position of a column (without regard to case), -1 when there is none; and the value
+    // at a position of the current row. For readers that look up their columns once.
+    int columnIndex(const QString& column) const { return connection_ ? indexOf(column) : -1; }
+    const QVariant& valueAt(int index) const { return row_.at(index); }
 
     // Releases the statement and its connection; the recordset then reads as empty.
     void close();
@@ -39,11 +44,13 @@ public:
 private:
     void execute();
     void readRow();
+    int indexOf(const QString& column) const;
 
     std::unique_ptr<DatabaseConnection> connection_;
     QString sql_;
     QSqlQuery query_;
     QSqlRecord record_;
+    mutable QHash<QString, int> positions_;
     QVector<QVariant> row_;
     bool bof_ = true;
     bool eof_ = true;

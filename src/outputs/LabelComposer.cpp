@@ -1,10 +1,7 @@
 #include "outputs/LabelComposer.h"
 
-#include "common/Fields.h"
 #include "db/Recordset.h"
 #include "outputs/HtmlFile.h"
-
-#include <array>
 
 using namespace Qt::StringLiterals;
 
@@ -17,86 +14,120 @@ constexpr std::array<int, 13> kContactFirstOrder = {0, 11, 3, 12, 1, 2, 6, 4, 7,
 constexpr int kDepartmentLine = 6;
 constexpr qsizetype kLineWidth = 30;
 
-// A column of the row; a column the statement does not select (the document address has no
-// block, state or country) reads as Null.
-QVariant column(const Recordset& row, const QString& name)
+const char16_t* const kColumnNames[] = {u"CardCode", u"CardName", u"MailAddres", u"MailCity", u"MailZipCod", u"Attn",
+                                        u"Department", u"CntctAddrs", u"MailBlock", u"MailCounty", u"MailState",
+                                        u"MailCountry"};
+
+// Blanks (spaces) off both ends, as the database values are trimmed.
+QStringView trimmed(QStringView text)
 {
-    return row.hasColumn(name) ? row.value(name) : QVariant();
+    while (!text.isEmpty() && text.front() == u' ')
+        text = text.mid(1);
+    while (!text.isEmpty() && text.back() == u' ')
+        text.chop(1);
+    return text;
 }
 
-QString cut(const QVariant& value, qsizetype width)
-{
-    return FieldText(value).left(width);
-}
+// One line of a label: up to four pieces of markup and values.
+struct LabelLine {
+    struct Piece {
+        QStringView text;
+        Html mode;
+    };
+    std::array<Piece, 4> pieces{};
+    int count = 0;
 
-QString crToBr(const QString& text)
-{
-    return QString(text).replace(u'\r', u"<br>"_s);
-}
-
-QString crCommaToBr(const QString& text)
-{
-    return QString(text).replace(u'\r', u"<br>"_s).replace(u',', u"<br>"_s);
-}
+    void add(QStringView text, Html mode) { pieces[count++] = {text, mode}; }
+    bool empty() const
+    {
+        for (int i = 0; i < count; ++i) {
+            if (!pieces[i].text.isEmpty())
+                return false;
+        }
+        return true;
+    }
+};
 
 }  // namespace
 
-bool IsHebrew(const QString& text)
+bool IsHebrew(QStringView text)
 {
     return std::any_of(text.begin(), text.end(), [](QChar c) { return c.unicode() >= 0x05D0 && c.unicode() <= 0x05EA; });
 }
 
-LabelComposer::LabelComposer(const LabelPage& page, const LabelDefTable& styles)
-    : page_(page), fixedAbove_(htmlText(styles[11].FixedText.left(kLineWidth))),
-      fixedBelow_(htmlText(styles[12].FixedText.left(kLineWidth)))
+LabelComposer::LabelComposer(const LabelPage& page, const LabelDefTable& styles, const Recordset& rows)
+    : page_(page), rows_(rows), fixedAbove_(styles[11].FixedText.left(kLineWidth)),
+      fixedBelow_(styles[12].FixedText.left(kLineWidth))
 {
+    for (int column = 0; column < ColumnCount; ++column)
+        columns_[column] = rows.columnIndex(QString::fromUtf16(kColumnNames[column]));
+    for (int line = 0; line < 13; ++line) {
+        hebrewPrefix_[line] = "    <tr class=L" + QByteArray::number(line) + "><td>";
+        otherPrefix_[line] = "    <tr class=LE" + QByteArray::number(line) + "><td>";
+    }
 }
 
-QStringList LabelComposer::lines(const Recordset& row) const
+QString LabelComposer::text(Column column) const
 {
-    QVariant direction = column(row, u"MailAddres"_s);
-    if (direction.isNull())
-        direction = column(row, u"MailCity"_s);
-    const bool hebrew = IsHebrew(FieldText(direction));
+    const int index = columns_[column];
+    if (index < 0)
+        return {};
+    const QVariant& value = rows_.valueAt(index);
+    return value.isNull() ? QString() : value.toString();
+}
 
-    std::array<QString, 13> text;
-    text[0] = hebrew ? u"לכבוד"_s : u"To"_s;
-    const QString code = TrimField(column(row, u"CardCode"_s));
-    if (!code.isEmpty())
-        text[2] = (hebrew ? u"קוד: "_s : u"Code: "_s) + htmlText(code);
-    const QString attn = TrimField(column(row, u"Attn"_s));
-    if (!attn.isEmpty()) {
-        const QString word = page_.showAttn ? (hebrew ? u"לידי:"_s : u"Attn:"_s) : QString();
-        text[3] = word + htmlText(attn);
-        const QString department = TrimField(column(row, u"Department"_s));
-        if (page_.enabled[kDepartmentLine] && !department.isEmpty())
-            text[3] += (page_.deptNewLine ? u"<br>"_s : u", "_s) + htmlText(department);
+void LabelComposer::write(TextFileWriter& file) const
+{
+    std::array<QString, ColumnCount> v;
+    for (int column = 0; column < ColumnCount; ++column)
+        v[column] = text(static_cast<Column>(column));
+
+    const int directionColumn = columns_[MailAddres] >= 0 && !rows_.valueAt(columns_[MailAddres]).isNull() ? MailAddres
+                                                                                                           : MailCity;
+    const bool hebrew = IsHebrew(v[directionColumn]);
+
+    std::array<LabelLine, 13> lines;
+    lines[0].add(hebrew ? u"לכבוד" : u"To", Html::Markup);
+    if (const QStringView code = trimmed(v[CardCode]); !code.isEmpty()) {
+        lines[2].add(hebrew ? u"קוד: " : u"Code: ", Html::Markup);
+        lines[2].add(code, Html::Text);
     }
-    text[11] = fixedAbove_;
-    text[1] = htmlText(cut(column(row, u"CardName"_s), kLineWidth));
-    text[12] = fixedBelow_;
-
-    const QVariant contactAddress = column(row, u"CntctAddrs"_s);
-    if (page_.contactAddressAllowed && !contactAddress.isNull() && contactAddress.toString().size() > 5) {
-        text[4] = crCommaToBr(htmlText(contactAddress.toString()));
+    if (const QStringView attn = trimmed(v[Attn]); !attn.isEmpty()) {
+        if (page_.showAttn)
+            lines[3].add(hebrew ? u"לידי:" : u"Attn:", Html::Markup);
+        lines[3].add(attn, Html::Text);
+        const QStringView department = trimmed(v[Department]);
+        if (page_.enabled[kDepartmentLine] && !department.isEmpty()) {
+            lines[3].add(page_.deptNewLine ? u"<br>" : u", ", Html::Markup);
+            lines[3].add(department, Html::Text);
+        }
+    }
+    lines[11].add(fixedAbove_, Html::Text);
+    lines[1].add(QStringView(v[CardName]).left(kLineWidth), Html::Text);
+    lines[12].add(fixedBelow_, Html::Text);
+    if (page_.contactAddressAllowed && v[CntctAddrs].size() > 5) {
+        lines[4].add(v[CntctAddrs], Html::TextCrCommaBr);
     } else {
-        text[4] = crToBr(htmlText(TrimField(column(row, u"MailAddres"_s))));
-        text[7] = htmlText(TrimField(column(row, u"MailBlock"_s)));
-        text[5] = htmlText(TrimField(column(row, u"MailCity"_s))) + u"&nbsp;&nbsp;&nbsp;&nbsp;"_s
-                  + htmlText(TrimField(column(row, u"MailZipCod"_s)));
+        lines[4].add(trimmed(v[MailAddres]), Html::TextCrBr);
+        lines[7].add(trimmed(v[MailBlock]), Html::Text);
+        lines[5].add(trimmed(v[MailCity]), Html::Text);
+        lines[5].add(u"&nbsp;&nbsp;&nbsp;&nbsp;", Html::Markup);
+        lines[5].add(trimmed(v[MailZipCod]), Html::Text);
     }
-    text[8] = htmlText(TrimField(column(row, u"MailCounty"_s)));
-    text[9] = htmlText(TrimField(column(row, u"MailState"_s)));
-    text[10] = htmlText(TrimField(column(row, u"MailCountry"_s)));
+    lines[8].add(trimmed(v[MailCounty]), Html::Text);
+    lines[9].add(trimmed(v[MailState]), Html::Text);
+    lines[10].add(trimmed(v[MailCountry]), Html::Text);
 
-    const QString cls = hebrew ? u" class=L"_s : u" class=LE"_s;
-    const auto& order = page_.templateIndex == 1 ? kContactFirstOrder : kStandardOrder;
-    QStringList printed;
-    for (const int line : order) {
-        if (line != kDepartmentLine && page_.enabled[line] && !text[line].isEmpty())
-            printed << u"    <tr"_s + cls + QString::number(line) + u"><td>"_s + text[line] + u"</td></tr>"_s;
+    const auto& prefixes = hebrew ? hebrewPrefix_ : otherPrefix_;
+    for (const int line : page_.templateIndex == 1 ? kContactFirstOrder : kStandardOrder) {
+        if (line == kDepartmentLine || !page_.enabled[line] || lines[line].empty())
+            continue;
+        file.bytes(prefixes[line]);
+        for (int i = 0; i < lines[line].count; ++i)
+            file.put(lines[line].pieces[i].text, lines[line].pieces[i].mode);
+        file.put(u"</td></tr>");
+        file.endLine();
     }
-    return printed;
 }
 
 }  // namespace pelmar

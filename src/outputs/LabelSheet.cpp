@@ -66,35 +66,32 @@ public:
 
     void page(qint64 number)
     {
-        file_.line(u"<table height='100%' width='100%' border='0' cellpadding='0' cellspacing='0' dir='rtl'>"_s);
+        file_.bytes("<table height='100%' width='100%' border='0' cellpadding='0' cellspacing='0' dir='rtl'>\r\n");
         for (int r = 1; r <= layout_.rows; ++r) {
-            file_.line(u"  <tr>"_s);
+            file_.bytes("  <tr>\r\n");
             for (int c = 1; c <= layout_.cols; ++c)
                 cell(number == 1 && (r - 1) * layout_.cols + c < layout_.start);
-            file_.line(u"  </tr>"_s);
+            file_.bytes("  </tr>\r\n");
         }
-        file_.line(u"</table>"_s);
+        file_.bytes("</table>\r\n");
     }
 
 private:
     void cell(bool beforeStart)
     {
-        file_.line(u"    <td class=TDL>"_s);
-        file_.line(u"     <table class=TBL1>"_s);
+        file_.bytes("    <td class=TDL>\r\n     <table class=TBL1>\r\n");
         while (queries_.wanted && !rows_.eof() && !passes(queries_, rows_))
             rows_.moveNext();
         if (beforeStart || rows_.eof()) {
-            file_.line(u"    <tr><td>&nbsp;</td></tr>"_s);
+            file_.bytes("    <tr><td>&nbsp;</td></tr>\r\n");
         } else {
-            for (const QString& line : composer_.lines(rows_))
-                file_.line(line);
+            composer_.write(file_);
             if (++copy_ == layout_.copies) {
                 copy_ = 0;
                 rows_.moveNext();
             }
         }
-        file_.line(u"     </table>"_s);
-        file_.line(u"    </td>"_s);
+        file_.bytes("     </table>\r\n    </td>\r\n");
     }
 
     TextFileWriter& file_;
@@ -144,7 +141,7 @@ void writeLabelSheet(const QString& path, const LabelPage& page, const LabelDefT
     auto rows = queries.client.open(queries.labels, queries.connString);
     if (rows->eof())
         return file.close();
-    const LabelComposer composer(page, styles);
+    const LabelComposer composer(page, styles, *rows);
     CellWriter cells(file, layout, queries, composer, *rows);
     for (qint64 number = 1; number <= pages; ++number)
         cells.page(number);

@@ -1,4 +1,5 @@
 #include "common/Windows1255.h"
+#include "outputs/LabelComposer.h"
 #include "outputs/LabelSheet.h"
 #include "outputs/LabelStyles.h"
 #include "outputs/LabelFixture.h"
@@ -233,6 +234,21 @@ TEST(LabelStyleRules, FontWeightSizeItalicAndUnderline)
     EXPECT_EQ(labelStyleRules(12, miriam)[0],
               u" .L12 {font-family:Miriam; font-weight:Bolder; font-size:0pt; font-style:Italic; text-align: right; "
               "direction: rtl; color:black;}"_s);
+}
+
+}  // namespace
+}  // namespace pelmar::test
+
+namespace pelmar::test {
+namespace {
+
+TEST(LabelDirection, ALabelIsHebrewWhenItsAddressOrElseCityHoldsAHebrewLetter)
+{
+    EXPECT_TRUE(IsHebrew(u"12 רחוב"_s));
+    EXPECT_TRUE(IsHebrew(u"ת"_s));
+    EXPECT_FALSE(IsHebrew(u"Main St 12"_s));
+    EXPECT_FALSE(IsHebrew(QString()));
+    EXPECT_FALSE(IsHebrew(u"\u05B0\u05F0"_s)) << "points and ligatures are not letters alef to tav";
 }
 
 }  // namespace
