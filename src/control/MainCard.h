@@ -3,6 +3,7 @@
 #include "control/MainCardControls.h"
 #include "control/Services.h"
 #include "outputs/LabelSheet.h"
+#include "outputs/RecipientList.h"
 #include "selection/Criteria.h"
 
 #include <QDate>
@@ -59,6 +60,20 @@ public:
     void RunLabels();
     bool CreateLabFile(const QString& pFileName);
 
+    // The recipient list of an output kind (2..6) written to a path; the preview writes
+    // "pelmar2.htm" in the temporary folder and opens it. False when the schema level could not
+    // be read (already reported) and nothing was written. Throws Failure.
+    bool CreateHTML(const QString& pFileName, short pOutType);
+
+    // The SMS run: asks for the file, writes the mobile numbers, says that the list is ready.
+    // A cancelled dialog is a failure (nothing written). CreateSMSFile is false when the schema
+    // level could not be read and nothing was written. Both throw Failure.
+    void SaveSMSList();
+    bool CreateSMSFile(const QString& pFileName);
+
+    // The page of one card; false when the schema level could not be read. Throws Failure.
+    bool CreateCardFile(const QString& pFileName, const QString& pCardCode);
+
     // 1 when the WinFax option is chosen, else 2 for the fax service, else 0.
     short GetOLEOption() const;
 
@@ -90,6 +105,7 @@ private:
     static const OutputType& outputTypeAt(int listIndex);
 
     LabelPage labelPage() const;
+    ListQuery listQuery(const QString& connString, short kind) const;
     bool readSchemaLevel(QString& connString);
     void buildPages();
     void connectHandlers();

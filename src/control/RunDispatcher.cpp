@@ -24,7 +24,7 @@ const MainCard::OutputType& MainCard::outputTypeAt(int listIndex)
         {u"מדבקות למעטפות"_s, u"להתחיל בהכנת המדבקות?"_s, {}, &MainCard::RunLabels},
         {u"מכתבים בפקס"_s, u"להתחיל במשלוח הפקסים?"_s, u"משלוח הפקסים הסתיים"_s, {}},
         {u"דואר אלקטרוני"_s, u"להתחיל במשלוח דואר אלקטרוני?"_s, u"הדיוור האלקטרוני הסתיים"_s, {}},
-        {u"לטלפונים סלולריים"_s, u"להתחיל בהכנת קובץ למשלוח הודעות לסלולריים?"_s, {}, {}},
+        {u"לטלפונים סלולריים"_s, u"להתחיל בהכנת קובץ למשלוח הודעות לסלולריים?"_s, {}, &MainCard::SaveSMSList},
         {u"הדפסת מכתבים"_s, u"להתחיל בהדפסת המכתבים?"_s, u"הדפסת המכתבים הסתיימה"_s, {}},
     };
     return types[listIndex >= 0 && listIndex < 5 ? listIndex : 0];
@@ -54,13 +54,6 @@ void MainCard::runOutput(const OutputType& output)
     }
     if (!output.finish.isEmpty())
         services_.messages.information(u"הודעה"_s, output.finish);
-}
-
-void MainCard::CmdPreview_Click()
-{
-    guarded([this] {
-        services_.messages.information(u"הודעה"_s, u"רשימת המעקב עדיין אינה זמינה בגרסה זו."_s);
-    });
 }
 
 }  // namespace pelmar

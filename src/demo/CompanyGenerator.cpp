@@ -100,7 +100,7 @@ private:
 
     void writeLookups()
     {
-        add(u"CINF"_s, {options_.companyName, options_.schemaLevel == 1 ? 900045 : 610012});
+        add(u"CINF"_s, {options_.companyName, options_.schemaLevel == 1 ? 900045 : 61012});
         const QList<std::tuple<int, QString, QString>> groups = {
             {100, u"לקוחות רגילים"_s, u"C"_s}, {101, u"לקוחות VIP"_s, u"C"_s}, {102, u"סיטונאים"_s, u"C"_s},
             {103, u"Export"_s, u"C"_s},        {104, u"מוסדות"_s, u"C"_s},      {105, u"ספקים מקומיים"_s, u"S"_s},

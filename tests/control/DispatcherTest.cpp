@@ -26,17 +26,6 @@ TEST_P(Dispatcher, AsksTheOutputsOwnQuestionAndNoStartsNothingButClearsTheStopFl
     EXPECT_TRUE(browser.opened.isEmpty());
 }
 
-TEST_P(Dispatcher, AnOutputThatIsNotAvailableSaysSoAndShowsNoFinishMessage)
-{
-    if (GetParam().listIndex <= 0)
-        GTEST_SKIP() << "labels are available";
-    c().cmbOutType->setCurrentIndex(GetParam().listIndex);
-    messages.answers = {true};
-    card->CmdLabPrev_Click();
-    ASSERT_EQ(messages.boxes.size(), 2);
-    EXPECT_EQ(messages.boxes[1].kind, u"information"_s);
-    EXPECT_TRUE(messages.boxes[1].text.contains(u"אינו זמין"_s)) << messages.boxes[1];
-}
 
 INSTANTIATE_TEST_SUITE_P(EveryOutputType, Dispatcher,
                          ::testing::Values(OutputCase{-1, u"להתחיל בהכנת המדבקות?"},
@@ -45,6 +34,27 @@ INSTANTIATE_TEST_SUITE_P(EveryOutputType, Dispatcher,
                                            OutputCase{2, u"להתחיל במשלוח דואר אלקטרוני?"},
                                            OutputCase{3, u"להתחיל בהכנת קובץ למשלוח הודעות לסלולריים?"},
                                            OutputCase{4, u"להתחיל בהדפסת המכתבים?"}));
+
+TEST_F(MainCardTest, AnOutputThatIsNotAvailableSaysSoAndShowsNoFinishMessage)
+{
+    for (const int index : {1, 2, 4}) {
+        messages.boxes.clear();
+        c().cmbOutType->setCurrentIndex(index);
+        card->CmdLabPrev_Click();
+        ASSERT_EQ(messages.boxes.size(), 2) << index;
+        EXPECT_EQ(messages.boxes[1].kind, u"information"_s);
+        EXPECT_TRUE(messages.boxes[1].text.contains(u"אינו זמין"_s)) << messages.boxes[1];
+    }
+}
+
+TEST_F(MainCardTest, AFailingRunIsReportedAndShowsNoFinishMessage)
+{
+    c().cmbOutType->setCurrentIndex(3);
+    card->CmdLabPrev_Click();
+    ASSERT_EQ(messages.boxes.size(), 2) << "the save dialog was cancelled";
+    EXPECT_EQ(messages.boxes[1].kind, u"critical"_s);
+    EXPECT_EQ(messages.boxes[1].title, u"תקלה"_s);
+}
 
 TEST_F(MainCardTest, TheStopButtonSetsTheStopFlag)
 {
