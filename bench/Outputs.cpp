@@ -2,6 +2,8 @@
 
 #include "common/SessionState.h"
 #include "outputs/LabelSheet.h"
+#include "outputs/RecipientList.h"
+#include "outputs/SmsList.h"
 #include "selection/Criteria.h"
 #include "selection/SelectBuilder.h"
 #include "selection/WhereBuilder.h"
@@ -47,11 +49,34 @@ void runLabels(const DatabaseClient& client, const QString& connString, const QS
     writeLabelSheet(path, page, styles, LabelQueries{client, connString, statements[0], statements[1], {}});
 }
 
+QStringList listStatements()
+{
+    return {statement(kLabels, true, true)};
+}
+
+void runList(const DatabaseClient& client, const QString& connString, const QString& path)
+{
+    writeRecipientList(path, kLabels, ListQuery{client, connString, listStatements()[0], {}}, ListPageLayout{8, 3, 1},
+                       QDate::currentDate());
+}
+
+QStringList smsStatements()
+{
+    return {statement(kMobiles, true, true)};
+}
+
+void runSms(const DatabaseClient& client, const QString& connString, const QString& path)
+{
+    writeSmsList(path, ListQuery{client, connString, smsStatements()[0], {}});
+}
+
 }  // namespace
 
 const QList<BenchOutput>& benchOutputs()
 {
-    static const QList<BenchOutput> outputs = {{u"labels"_s, &labelStatements, &runLabels}};
+    static const QList<BenchOutput> outputs = {{u"labels"_s, &labelStatements, &runLabels},
+                                               {u"list"_s, &listStatements, &runList},
+                                               {u"sms"_s, &smsStatements, &runSms}};
     return outputs;
 }
 

@@ -77,17 +77,22 @@ bool Recordset::hasColumn(const QString& column) const
     return connection_ && indexOf(column) >= 0;
 }
 
+int Recordset::requiredColumn(const QString& column) const
+{
+    const int index = columnIndex(column);
+    if (index < 0)
+        throw Failure(QStringLiteral("Item cannot be found in the collection corresponding to the "
+                                     "requested name or ordinal (%1).").arg(column),
+                      3265);
+    return index;
+}
+
 QVariant Recordset::value(const QString& column) const
 {
     if (eof_)
         throw Failure(QStringLiteral("Either BOF or EOF is True, or the current record has been deleted."),
                       3021);
-    const int index = indexOf(column);
-    if (index < 0 || index >= row_.size())
-        throw Failure(QStringLiteral("Item cannot be found in the collection corresponding to the "
-                                     "requested name or ordinal (%1).").arg(column),
-                      3265);
-    return row_.at(index);
+    return row_.at(requiredColumn(column));
 }
 
 void Recordset::close()

@@ -36,6 +36,8 @@ public:
     // The position of a column (without regard to case), -1 when there is none; and the value
     // at a position of the current row. For readers that look up their columns once.
     int columnIndex(const QString& column) const { return connection_ ? indexOf(column) : -1; }
+    // The position of a column the reader cannot do without; throws Failure when there is none.
+    int requiredColumn(const QString& column) const;
     const QVariant& valueAt(int index) const { return row_.at(index); }
 
     // Releases the statement and its connection; the recordset then reads as empty.

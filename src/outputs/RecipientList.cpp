@@ -68,18 +68,34 @@ void writeHead(TextFileWriter& file, const ListKind& kind, const QDate& today)
     file.line(separator);
 }
 
-void writeCell(TextFileWriter& file, const ListColumn& column, const Recordset& row)
+// A list column bound to the positions of its columns in one recordset.
+struct BoundColumn {
+    int value;
+    int card;  // -1 when the column has no card fallback
+    bool leftAligned;
+};
+
+QList<BoundColumn> bind(const QList<ListColumn>& columns, const Recordset& rows)
 {
-    QVariant value = row.value(column.column);
-    if (!column.cardColumn.isEmpty())
-        value = ValueOrDefault(value, row.value(column.cardColumn));
-    file.put(column.leftAligned ? u"    <td align='left'>" : u"    <td>");
-    if (value.isNull())
-        file.put(u"&nbsp;");
+    QList<BoundColumn> bound;
+    for (const ListColumn& column : columns) {
+        const int card = column.cardColumn.isEmpty() ? -1 : rows.requiredColumn(column.cardColumn);
+        bound.append({rows.requiredColumn(column.column), card, column.leftAligned});
+    }
+    return bound;
+}
+
+void writeCell(TextFileWriter& file, const BoundColumn& column, const Recordset& row)
+{
+    const QVariant* value = &row.valueAt(column.value);
+    if (column.card >= 0 && (value->isNull() || value->toString().isEmpty()))
+        value = &row.valueAt(column.card);
+    file.bytes(column.leftAligned ? QByteArrayLiteral("    <td align='left'>") : QByteArrayLiteral("    <td>"));
+    if (value->isNull())
+        file.bytes(QByteArrayLiteral("&nbsp;"));
     else
-        file.put(value.toString(), Html::Text);
-    file.put(u"</td>");
-    file.endLine();
+        file.put(value->toString(), Html::Text);
+    file.bytes(QByteArrayLiteral("</td>\r\n"));
 }
 
 }  // namespace
@@ -101,15 +117,16 @@ void writeRecipientList(const QString& path, short kind, const ListQuery& query,
     auto rows = query.client.open(query.statement, query.connString);
     if (rows->eof())
         return file.close();
+    const QList<BoundColumn> columns = bind(list.columns, *rows);
     qint64 count = 0;
     for (; !rows->eof(); rows->moveNext()) {
         if (query.wanted && !query.wanted(FieldText(rows->value(u"CardCode"_s))))
             continue;
         ++count;
-        file.line(u"  <tr valign='middle' bgcolor='#FFFFFF' align='right'>");
-        for (const ListColumn& column : list.columns)
+        file.bytes(QByteArrayLiteral("  <tr valign='middle' bgcolor='#FFFFFF' align='right'>\r\n"));
+        for (const BoundColumn& column : columns)
             writeCell(file, column, *rows);
-        file.line(u"  </tr>");
+        file.bytes(QByteArrayLiteral("  </tr>\r\n"));
     }
     file.line(u"</table>");
     file.line(u"<hr noshade width='100%' size='2'>");

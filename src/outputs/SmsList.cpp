@@ -12,8 +12,10 @@ void writeSmsList(const QString& path, const ListQuery& query)
 {
     TextFileWriter file(path, false);
     auto rows = query.client.open(query.statement, query.connString);
-    const int contactMobile = rows->columnIndex(u"CMobile"_s);
-    const int cardMobile = rows->columnIndex(u"Mobile"_s);
+    if (rows->eof())
+        return file.close();
+    const int contactMobile = rows->requiredColumn(u"CMobile"_s);
+    const int cardMobile = rows->requiredColumn(u"Mobile"_s);
     for (; !rows->eof(); rows->moveNext()) {
         if (query.wanted && !query.wanted(FieldText(rows->value(u"CardCode"_s))))
             continue;
