@@ -1,48 +1,22 @@
+#include "app/Cli.h"
 #include "common/SessionState.h"
 #include "control/MainCard.h"
 #include "control/RealServices.h"
 
-#include "common/Failure.h"
-#include "demo/DemoCompany.h"
-#include "settings/SettingsStore.h"
-
 #include <QApplication>
-#include <QTextStream>
+#include <QDir>
+#include <QFile>
 #include <QMainWindow>
+
+#include <unistd.h>
 
 using namespace Qt::StringLiterals;
 
 namespace {
 
-// "pelmar demo [--force]": creates the demo company without opening a window.
-int runDemo(const QStringList& arguments)
+// The window: the mailing control on a host window titled "Pelmar".
+int runWindow()
 {
-    pelmar::SettingsStore store = pelmar::SettingsStore::forCurrentUser();
-    try {
-        const auto result = pelmar::createDemoCompany(store, pelmar::embeddedCompaniesFolder(),
-                                                      arguments.contains(u"--force"_s));
-        QTextStream(stdout) << result.message << Qt::endl;
-        return 0;
-    } catch (const pelmar::Failure& failure) {
-        QTextStream(stderr) << u"תקלה: "_s << failure.description() << Qt::endl;
-        return 1;
-    }
-}
-
-}  // namespace
-
-int main(int argc, char* argv[])
-{
-    if (argc > 1 && qstrcmp(argv[1], "demo") == 0) {
-        QCoreApplication core(argc, argv);
-        return runDemo(QCoreApplication::arguments().mid(2));
-    }
-    QApplication app(argc, argv);
-    QApplication::setApplicationName(u"Pelmar"_s);
-    QApplication::setOrganizationName(u"Pelmar"_s);
-    QApplication::setApplicationVersion(QStringLiteral(PELMAR_VERSION));
-    QApplication::setLayoutDirection(Qt::RightToLeft);
-
     pelmar::RealServices real;
     pelmar::SessionState state;
     QMainWindow window;
@@ -50,7 +24,39 @@ int main(int argc, char* argv[])
     auto* card = new pelmar::MainCard(real.services(), state, &window);
     window.setCentralWidget(card);
     card->UserControl_Initialize();
-    window.resize(1000, 720);
+    window.resize(1024, 720);
     window.show();
     return QApplication::exec();
+}
+
+// Qt warns on every start when the session has no runtime folder (a scheduled job, a container);
+// give it the private folder it would pick itself.
+void ensureRuntimeFolder()
+{
+    if (!qEnvironmentVariableIsEmpty("XDG_RUNTIME_DIR"))
+        return;
+    const QString folder = QDir::tempPath() + u"/runtime-"_s + QString::number(::getuid());
+    QDir().mkpath(folder);
+    QFile::setPermissions(folder, QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner);
+    qputenv("XDG_RUNTIME_DIR", folder.toLocal8Bit());
+}
+
+}  // namespace
+
+int main(int argc, char* argv[])
+{
+    ensureRuntimeFolder();
+    // Any argument makes a command, which runs without a display: the control is built on Qt's
+    // offscreen platform.
+    const bool command = argc > 1;
+    if (command && qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    QApplication app(argc, argv);
+    QApplication::setApplicationName(u"Pelmar"_s);
+    QApplication::setOrganizationName(u"Pelmar"_s);
+    QApplication::setApplicationVersion(QStringLiteral(PELMAR_VERSION));
+    QApplication::setLayoutDirection(Qt::RightToLeft);
+    if (command)
+        return pelmar::runCommandLine(QApplication::arguments().mid(1));
+    return runWindow();
 }

@@ -63,7 +63,9 @@ bool truthOf(const QObject* control, const QString& text)
     return number != 0;
 }
 
-void writeProperty(QObject* control, unsigned char prop, const QString& text)
+}  // namespace
+
+void assignProperty(QObject* control, unsigned char prop, const QString& text)
 {
     switch (prop) {
     case kPropText:
@@ -98,8 +100,6 @@ void writeProperty(QObject* control, unsigned char prop, const QString& text)
     throw Failure(QStringLiteral("%1 has no such property.").arg(control->objectName()), 438);
 }
 
-}  // namespace
-
 void SetGetCtrl(unsigned char action, SettingsStore& store, const QString& app, const QString& section,
                 const QString& key, QObject* control, unsigned char prop, const QString& fallback)
 {
@@ -108,7 +108,7 @@ void SetGetCtrl(unsigned char action, SettingsStore& store, const QString& app, 
     if (action == kSave)
         store.setValue(app, section, key, readProperty(control, prop));
     else if (action == kLoad)
-        writeProperty(control, prop, store.value(app, section, key, fallback));
+        assignProperty(control, prop, store.value(app, section, key, fallback));
 }
 
 }  // namespace pelmar

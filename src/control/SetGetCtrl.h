@@ -21,6 +21,10 @@ enum SetGetAction : unsigned char {
     kLoad = 2,
 };
 
+// Assigns a text to one property of a control, converted as a stored setting is. Throws
+// Failure (and leaves the control as it was) when the control cannot take the text.
+void assignProperty(QObject* control, unsigned char prop, const QString& text);
+
 // Moves one control property to (action 1) or from (action 2) one settings key; fallback is
 // used when the key is missing. Any other action or property does nothing.
 // Throws Failure when the store cannot be written or the control cannot take the stored text

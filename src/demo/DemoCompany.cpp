@@ -58,6 +58,12 @@ DemoResult createDemoCompany(SettingsStore& store, const QString& folder, bool f
     store.setValue(kApp, kParams, u"ConnUID"_s, u"demo"_s);
     store.setValue(kApp, kParams, u"ConnPWD"_s, QString());
     store.setValue(kApp, kParams, u"ConnDataBase"_s, kDemoDatabase);
+    // A first sheet of the demo shows the usual lines; lines the user already chose stay as chosen.
+    for (int line = 0; line <= 5; ++line) {
+        const QString key = u"UseTitle"_s + QString::number(line);
+        if (!store.contains(kApp, kParams, key))
+            store.setValue(kApp, kParams, key, u"1"_s);
+    }
     return {folder, true, u"The demo company is ready in %1, and Pelmar is connected to it."_s.arg(folder)};
 }
 
