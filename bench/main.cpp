@@ -4,10 +4,12 @@
 // its peak memory is its own. Prints one table.
 //
 //   pelmar_bench [--cards N,N,...] [--engines embedded,postgresql] [--outputs labels,...]
+//   pelmar_bench picker [CARDS]             the card picker's fill, sorts and search
 //   pelmar_bench generate FOLDER CARDS      an embedded company "bench" for profiling
 //   pelmar_bench measure floor|run OUTPUT DRIVER CONNSTRING      one measurement
 
 #include "bench/Outputs.h"
+#include "bench/Picker.h"
 #include "common/Failure.h"
 #include "db/ConnString.h"
 #include "db/DatabaseClient.h"
@@ -167,6 +169,8 @@ int main(int argc, char* argv[])
         return measure(args.mid(1));
     if (args.value(0) == u"generate"_s)
         return generate(args.mid(1));
+    if (args.value(0) == u"picker"_s)
+        return bench::measurePicker(args.value(1, u"100000"_s).toInt());
     try {
         return runAll(args);
     } catch (const Failure& failure) {

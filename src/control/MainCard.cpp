@@ -10,6 +10,8 @@
 #include "control/pages/Pages.h"
 #include "db/ui/LogonDialog.h"
 #include "outputs/ui/LabelStyleDialog.h"
+#include "selection/ui/SelectByFileDialog.h"
+#include "selection/ui/SelectCardDialog.h"
 
 #include <QComboBox>
 #include <QCoreApplication>
@@ -35,6 +37,8 @@ MainCard::MainCard(Services services, SessionState& state, QWidget* parent)
     buildPages();
     connectHandlers();
 }
+
+MainCard::~MainCard() = default;
 
 void MainCard::buildPages()
 {
@@ -63,6 +67,10 @@ void MainCard::connectHandlers()
     for (int i = 1; i <= 3; ++i)
         connect(c_.CmdDir[i], &QToolButton::clicked, this, [this, i] { CmdDir_Click(i); });
     c_.cmbCS->installEventFilter(this);
+    connect(c_.cmdSelectAccount, &QPushButton::clicked, this, &MainCard::cmdSelectAccount_Click);
+    connect(c_.CmdSelectGroup, &QPushButton::clicked, this, &MainCard::CmdSelectGroup_Click);
+    connect(c_.cmdQryGroup, &QPushButton::clicked, this, &MainCard::cmdQryGroup_Click);
+    connect(c_.cmdSelByFile, &QPushButton::clicked, this, &MainCard::cmdSelByFile_Click);
 }
 
 bool MainCard::eventFilter(QObject* watched, QEvent* event)

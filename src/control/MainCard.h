@@ -11,9 +11,12 @@
 #include <QWidget>
 
 #include <functional>
+#include <memory>
 
 namespace pelmar {
 
+class SelectByFileDialog;
+class SelectCardDialog;
 struct SessionState;
 
 // The mailing control: five pages of options, the output chosen in cmbOutType, and the buttons
@@ -23,6 +26,7 @@ class MainCard : public QWidget {
     Q_OBJECT
 public:
     MainCard(Services services, SessionState& state, QWidget* parent = nullptr);
+    ~MainCard() override;
 
     // Start-up: connection settings, run log, connection test and sales employees, every option,
     // label styles, picker state, department caption, criteria page. Each step's failure is
@@ -89,6 +93,16 @@ public:
     void Label56_DblClick();
     void cmbCS_Validate();
 
+    // The pickers: hand-picked cards (the picker keeps its rows and marks until the list is
+    // rebuilt), card groups, properties, and the card list from a file (kept with what it read
+    // until OK).
+    void cmdSelectAccount_Click();
+    void CmdSelectGroup_Click();
+    void cmdQryGroup_Click();
+    void cmdSelByFile_Click();
+    SelectCardDialog* cardPicker() const { return cardPicker_.get(); }
+    SelectByFileDialog* fileDialog() const { return fileDialog_.get(); }
+
     // Progress of a run: the fill gets processed / total of the frame's width; 0 clears it.
     void setProgress(long processed, long total);
     void setProgressText(const QString& text);
@@ -114,9 +128,13 @@ private:
     void guarded(const std::function<void()>& handler);
     QString PickOpenFile(int index);
 
+    void openCardPage(const QString& code);
+
     Services services_;
     SessionState& state_;
     MainCardControls c_;
+    std::unique_ptr<SelectCardDialog> cardPicker_;
+    std::unique_ptr<SelectByFileDialog> fileDialog_;
 };
 
 }  // namespace pelmar
