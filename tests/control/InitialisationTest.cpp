@@ -2,13 +2,11 @@
 #include "db/ConnString.h"
 #include "log/RunLog.h"
 #include "support/Engines.h"
+#include "support/ModalCloser.h"
 
-#include <QApplication>
 #include <QComboBox>
-#include <QDialog>
 #include <QFile>
 #include <QLineEdit>
-#include <QTimer>
 
 using namespace Qt::StringLiterals;
 
@@ -69,15 +67,11 @@ TEST_F(Initialisation, ClosingTheLogonDialogReloadsTheStoredSettingsAndEmptiesTh
     card->UserControl_Initialize();
     c().txtRows->setText(u"99"_s);
     WriteLog(u"SELECT 1"_s, u"t"_s);
-    QTimer closer;
     QString seenTitle;
-    QObject::connect(&closer, &QTimer::timeout, [&] {
-        if (auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget())) {
-            seenTitle = dialog->windowTitle();
-            dialog->reject();
-        }
+    const ModalCloser closer([&](QDialog& dialog) {
+        seenTitle = dialog.windowTitle();
+        dialog.reject();
     });
-    closer.start(10);
     card->CmdConnect_Click();
     EXPECT_EQ(seenTitle, u"Connect to SAP Business One"_s);
     EXPECT_EQ(c().txtRows->text(), u"8"_s);

@@ -7,8 +7,8 @@
 #include "support/CompanyRows.h"
 #include "support/Engines.h"
 #include "support/MainCardFixture.h"
+#include "support/ModalCloser.h"
 
-#include <QApplication>
 #include <QCheckBox>
 #include <QComboBox>
 #include <QLabel>
@@ -16,7 +16,6 @@
 #include <QPushButton>
 #include <QRadioButton>
 #include <QTableView>
-#include <QTimer>
 
 using namespace Qt::StringLiterals;
 
@@ -103,14 +102,10 @@ TEST_F(PickersTest, TheGroupButtonNeedsACardTypeAndTicksTheCriterion)
 
     c().cmbCS->setCurrentIndex(1);
     QString title;
-    QTimer closer;
-    QObject::connect(&closer, &QTimer::timeout, [&] {
-        if (auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget())) {
-            title = dialog->objectName();
-            dialog->reject();
-        }
+    const ModalCloser closer([&](QDialog& dialog) {
+        title = dialog.objectName();
+        dialog.reject();
     });
-    closer.start(10);
     card->CmdSelectGroup_Click();
     EXPECT_EQ(title, u"frmCardGroup"_s);
     EXPECT_TRUE(c().ChkCatCode->isChecked());
@@ -182,12 +177,7 @@ TEST_F(PickersTest, TheCardPickerListsSearchesSortsAndStoresTheCheckedCodesInGri
 
 TEST_F(PickersTest, NoToTheRescanQuestionKeepsThePickerAndItsMarks)
 {
-    QTimer closer;
-    QObject::connect(&closer, &QTimer::timeout, [&] {
-        if (auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget()))
-            dialog->reject();
-    });
-    closer.start(10);
+    const ModalCloser closer;
     c().ChkItems->setChecked(true);
     card->cmdSelectAccount_Click();
     EXPECT_TRUE(c().ChkSelectAccount->isChecked());
@@ -273,20 +263,16 @@ TEST_F(CardFileTest, TheDialogReadsCountsAndCopiesOnOkWithItsOptionsSaved)
 TEST_F(CardFileTest, CancelKeepsWhatWasReadForALaterOk)
 {
     store->setValue(u"Pelmar"_s, u"ImportFile"_s, u"FileName"_s, file("h\r\na\tC9\r\n"));
-    QTimer closer;
     int round = 0;
-    QObject::connect(&closer, &QTimer::timeout, [&] {
-        auto* dialog = qobject_cast<SelectByFileDialog*>(QApplication::activeModalWidget());
-        if (!dialog)
-            return;
+    const ModalCloser closer([&](QDialog& shown) {
+        auto& dialog = static_cast<SelectByFileDialog&>(shown);
         if (round++ == 0) {
-            dialog->cmdReadFile_Click();
-            dialog->cmdClose_Click();
+            dialog.cmdReadFile_Click();
+            dialog.cmdClose_Click();
         } else {
-            dialog->cmdOK_Click();
+            dialog.cmdOK_Click();
         }
     });
-    closer.start(10);
     card->cmdSelByFile_Click();
     EXPECT_TRUE(state.WantedCrd.isEmpty());
     EXPECT_TRUE(c().ChkSelectAccount->isChecked());
