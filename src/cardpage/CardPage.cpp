@@ -36,6 +36,11 @@ const char16_t* const kHead[] = {
     u"<table class=TblClean width='100%' border='0' cellpadding='3' cellspacing='3'>",
 };
 
+struct CardProperties {
+    bool anySet;
+    QStringList names;
+};
+
 const QString kRowStart = u"  <tr valign='middle' bgcolor='#FFFFFF' align='right'>"_s;
 
 QString cardTypeName(const QString& type)
@@ -66,9 +71,9 @@ public:
             file_.line(line);
     }
 
-    // The names of the card's properties in the order OCQG gives them; std::nullopt when there
-    // is no such card.
-    std::optional<QStringList> properties()
+    // Whether some property of the card is set, and the names OCQG gives the set ones, in its
+    // order; std::nullopt when there is no such card.
+    std::optional<CardProperties> properties()
     {
         QString select = u"Select OCRD.CardCode"_s;
         for (int n = 1; n <= 64; ++n)
@@ -81,20 +86,20 @@ public:
         for (int n = 1; n <= 64; ++n)
             any |= set[n] = FieldText(card->value(u"QryGroup"_s + QString::number(n))) == u"Y"_s;
         card->close();
-        QStringList names;
+        CardProperties found{any, {}};
         if (!any)
-            return names;
+            return found;
         auto groups = client_.open(u"Select OCQG.GroupCode, OCQG.GroupName From OCQG"_s, connString_);
         for (; !groups->eof(); groups->moveNext()) {
             const int number = groups->value(u"GroupCode"_s).toInt();
             if (number >= 1 && number <= 64 && set[number])
-                names << FieldText(groups->value(u"GroupName"_s));
+                found.names << FieldText(groups->value(u"GroupName"_s));
         }
-        return names;
+        return found;
     }
 
     // The general blocks; false when the card has no row joined with its group.
-    bool general(const std::optional<QStringList>& properties)
+    bool general(const CardProperties& properties)
     {
         auto card = client_.open(u"Select OCRD.CardCode, OCRD.CardName, OCRD.CardFName, OCRD.CardType, OCRG.GroupName, "
                                  "OCRD.LicTradNum, OCRD.Phone1, OCRD.Phone2, OCRD.Cellular, OCRD.Fax, OCRD.E_Mail, "
@@ -116,8 +121,8 @@ public:
                    {u"Phone1"_s, u"Phone2"_s, u"Cellular"_s, u"Fax"_s}, row);
         valueBlock({u"שם לועזי"_s, u"עוסק מורשה"_s, u"דואל"_s, u"הערות"_s},
                    {u"CardFName"_s, u"LicTradNum"_s, u"E_Mail"_s, u"Notes"_s}, row);
-        if (properties && !properties->isEmpty())
-            block({u"מאפיינים"_s}, [&] { cell(u"     <td>", properties->join(u", "_s)); });
+        if (properties.anySet)
+            block({u"מאפיינים"_s}, [&] { cell(u"     <td>", properties.names.join(u", "_s)); });
         file_.line(u" </table>");
         file_.line(u"</td></tr>");
         return true;
@@ -268,7 +273,7 @@ void CreateCardFile(const QString& pFileName, const QString& pCardCode, const Da
     CardPageWriter page(file, client, connString, sqlText(pCardCode));
     page.head();
     const auto properties = page.properties();
-    if (!properties || !page.general(properties))
+    if (!properties || !page.general(*properties))
         return file.close();
     if (level == 1)
         page.addressesNewer();

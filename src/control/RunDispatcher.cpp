@@ -46,13 +46,12 @@ void MainCard::runOutput(const OutputType& output)
             u"הודעה"_s, u"הפלט \"%1\" עדיין אינו זמין בגרסה זו. לא בוצע דבר."_s.arg(output.caption));
         return;
     }
-    try {
+    bool completed = false;
+    guarded([&] {
         output.run(*this);
-    } catch (const Failure& failure) {
-        services_.messages.critical(u"תקלה"_s, failure.description());
-        return;
-    }
-    if (!output.finish.isEmpty())
+        completed = true;
+    });
+    if (completed && !output.finish.isEmpty())
         services_.messages.information(u"הודעה"_s, output.finish);
 }
 

@@ -10,6 +10,7 @@ namespace pelmar {
 
 namespace {
 
+// The logon dialog waits at most this long for a server.
 constexpr int kListLoginTimeout = 10;
 
 }  // namespace
@@ -35,7 +36,7 @@ QStringList databasesToCheck(const QString& text)
 void checkCompanyDatabase(const DatabaseClient& client, const QString& server, const QString& uid,
                           const QString& pwd, const QString& database)
 {
-    client.open(u"SELECT * FROM OCRD"_s, BuildConnString(server, uid, pwd, database));
+    client.open(u"SELECT * FROM OCRD"_s, BuildConnString(server, uid, pwd, database), kListLoginTimeout);
 }
 
 }  // namespace pelmar

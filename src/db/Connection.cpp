@@ -7,6 +7,8 @@
 #include "db/DatabaseClient.h"
 #include "settings/SettingsStore.h"
 
+#include <cmath>
+
 
 using namespace Qt::StringLiterals;
 
@@ -56,9 +58,10 @@ short GetSboVersionLevel(const DatabaseClient& client, const QString& connString
     try {
         auto versions = client.open(u"SELECT Version FROM CINF"_s, connString);
         bool numeric = false;
-        const qlonglong version = versions->value(u"Version"_s).toString().trimmed().toLongLong(&numeric);
-        if (!numeric || version < INT32_MIN || version > INT32_MAX)
+        const double stored = versions->value(u"Version"_s).toString().trimmed().toDouble(&numeric);
+        if (!numeric || stored < INT32_MIN || stored > INT32_MAX)
             throw Failure(u"Type mismatch: the company database's version is not a number."_s, 13);
+        const auto version = static_cast<qint32>(std::nearbyint(stored));
         return version / 1000 >= 62 ? 1 : 0;
     } catch (const Failure& failure) {
         messages.critical(u"תקלה"_s, failure.description());

@@ -41,8 +41,11 @@ TextFileWriter::TextFileWriter(const QString& path, bool html) : file_(path), ht
     buffer_.reserve(kFlushAt + 4096);
 }
 
+// A run that fails leaves the file as far as it was written, so what is buffered goes out too.
 TextFileWriter::~TextFileWriter()
 {
+    if (file_.isOpen() && !buffer_.isEmpty())
+        file_.write(buffer_);
     file_.close();
 }
 

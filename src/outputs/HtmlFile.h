@@ -18,7 +18,8 @@ enum class Html {
 // A text file written in windows-1255 with CR LF line ends, as every generated file of the
 // system is, through a buffer of its own. A character the code page lacks is written as an HTML
 // numeric reference in HTML files and as "?" in plain text files. An earlier file of the same
-// name is replaced. Every failure throws Failure naming the file.
+// name is replaced. Every failure throws Failure naming the file. A writer destroyed without
+// close() (a run that failed) still writes what it had buffered.
 class TextFileWriter {
 public:
     TextFileWriter(const QString& path, bool html);

@@ -136,7 +136,7 @@ void writeLabelSheet(const QString& path, const LabelPage& page, const LabelDefT
     counting->close();
 
     const qint64 positions = qint64(layout.copies) * (layout.start + count - 1);
-    const qint64 pages = positions <= 0 ? 0 : (positions + layout.perPage() - 1) / layout.perPage();
+    const qint64 pages = positions / layout.perPage() + (positions % layout.perPage() != 0 ? 1 : 0);
 
     auto rows = queries.client.open(queries.labels, queries.connString);
     if (rows->eof())

@@ -107,24 +107,62 @@ int CheckListModel::findPrefix(int textIndex, const QString& prefix) const
     return -1;
 }
 
-void CheckListModel::sortByText(int textIndex)
+namespace {
+
+// A text as the grid's generic order sees it: numbers by their value, before other texts, which
+// compare without regard to case.
+struct SortKey {
+    bool numeric;
+    double number;
+    const QString* text;
+
+    bool operator<(const SortKey& other) const
+    {
+        if (numeric != other.numeric)
+            return numeric;
+        if (numeric)
+            return number < other.number;
+        return QString::compare(*text, *other.text, Qt::CaseInsensitive) < 0;
+    }
+};
+
+SortKey sortKeyOf(const QString& text)
+{
+    bool numeric = false;
+    const double number = text.toDouble(&numeric);
+    return {numeric, number, &text};
+}
+
+}  // namespace
+
+void CheckListModel::sortRows(int textIndex, bool checkedFirst)
 {
     beginResetModel();
-    std::stable_sort(rows_.begin(), rows_.end(), [textIndex](const Row& a, const Row& b) {
-        return QString::compare(a.texts.at(textIndex), b.texts.at(textIndex), Qt::CaseInsensitive) < 0;
+    QVector<std::pair<SortKey, qsizetype>> order;
+    order.reserve(rows_.size());
+    for (qsizetype i = 0; i < rows_.size(); ++i)
+        order.append({sortKeyOf(rows_[i].texts.at(textIndex)), i});
+    std::stable_sort(order.begin(), order.end(), [&](const auto& a, const auto& b) {
+        if (checkedFirst && rows_[a.second].checked != rows_[b.second].checked)
+            return rows_[a.second].checked;
+        return a.first < b.first;
     });
+    QVector<Row> sorted;
+    sorted.reserve(rows_.size());
+    for (const auto& entry : order)
+        sorted.append(rows_[entry.second]);
+    rows_ = std::move(sorted);
     endResetModel();
+}
+
+void CheckListModel::sortByText(int textIndex)
+{
+    sortRows(textIndex, false);
 }
 
 void CheckListModel::sortByCheckThenText(int textIndex)
 {
-    beginResetModel();
-    std::stable_sort(rows_.begin(), rows_.end(), [textIndex](const Row& a, const Row& b) {
-        if (a.checked != b.checked)
-            return a.checked;
-        return QString::compare(a.texts.at(textIndex), b.texts.at(textIndex), Qt::CaseInsensitive) < 0;
-    });
-    endResetModel();
+    sortRows(textIndex, true);
 }
 
 QStringList CheckListModel::checkedKeys() const

@@ -45,7 +45,8 @@ public:
     // none does or the prefix is empty.
     int findPrefix(int textIndex, const QString& prefix) const;
 
-    // Sorts by a text, ascending; or checked rows first and then by the text.
+    // Sorts by a text in the grid's generic ascending order (numbers by value first, then other
+    // texts without regard to case); or checked rows first and then by the text.
     void sortByText(int textIndex);
     void sortByCheckThenText(int textIndex);
 
@@ -53,6 +54,8 @@ public:
     QStringList checkedKeys() const;
 
 private:
+    void sortRows(int textIndex, bool checkedFirst);
+
     QStringList headers_;
     QList<int> columns_;
     QVector<Row> rows_;

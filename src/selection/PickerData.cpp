@@ -7,6 +7,7 @@
 #include "selection/DocTypes.h"
 
 #include <QFile>
+#include <QRegularExpression>
 
 using namespace Qt::StringLiterals;
 
@@ -37,29 +38,32 @@ QString fieldOf(const QString& line, int column)
 
 }  // namespace
 
-QVector<CheckListModel::Row> readCardGroups(const DatabaseClient& client, const QString& connString, short cardType)
+void readCardGroups(const DatabaseClient& client, const QString& connString, short cardType,
+                    QVector<CheckListModel::Row>& rows)
 {
     QString statement = u"SELECT * FROM OCRG"_s;
     if (cardType >= 0)
         statement += u" WHERE GroupType='"_s + CardTypeCode(cardType, true) + u"'"_s;
     statement += u" ORDER BY GroupType, GroupCode"_s;
-    QVector<CheckListModel::Row> rows;
     for (auto groups = client.open(statement, connString); !groups->eof(); groups->moveNext())
         rows.append({QString::number(groups->value(u"GroupCode"_s).toInt()), {nameOrDash(groups->value(u"GroupName"_s))}});
-    return rows;
 }
 
-QVector<CheckListModel::Row> readProperties(const DatabaseClient& client, const QString& connString)
+QVector<CheckListModel::Row> unnamedProperties()
 {
     QVector<CheckListModel::Row> rows;
     for (int n = 1; n <= 64; ++n)
         rows.append({QString::number(n), {u"-"_s}});
+    return rows;
+}
+
+void nameProperties(const DatabaseClient& client, const QString& connString, QVector<CheckListModel::Row>& properties)
+{
     for (auto names = client.open(u"SELECT * FROM OCQG Order By GroupCode"_s, connString); !names->eof(); names->moveNext()) {
         const int n = names->value(u"GroupCode"_s).toInt();
         if (n >= 1 && n <= 64)
-            rows[n - 1].texts = {nameOrDash(names->value(u"GroupName"_s))};
+            properties[n - 1].texts = {nameOrDash(names->value(u"GroupName"_s))};
     }
-    return rows;
 }
 
 void readCardList(const DatabaseClient& client, const QString& connString, const QString& statement,
@@ -97,17 +101,15 @@ QStringList readCardFile(const QString& path, int column, bool skipFirstLine)
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly))
         throw Failure(u"לא ניתן לקרוא את הקובץ %1: %2"_s.arg(path, file.errorString()), 53);
-    QStringList lines = decodeUserText(file.readAll()).split(u'\n');
+    static const QRegularExpression lineEnd(u"\r\n|\r|\n"_s);
+    QStringList lines = decodeUserText(file.readAll()).split(lineEnd);
     if (!lines.isEmpty() && lines.last().isEmpty())
         lines.removeLast();
     if (skipFirstLine && !lines.isEmpty())
         lines.removeFirst();
     QStringList codes;
-    for (QString& line : lines) {
-        if (line.endsWith(u'\r'))
-            line.chop(1);
+    for (const QString& line : lines)
         codes << fieldOf(line, column);
-    }
     return codes;
 }
 

@@ -10,13 +10,17 @@ namespace pelmar {
 
 class DatabaseClient;
 
-// The card groups of a card type (cmbCS index; leads list the customer groups, -1 all groups),
-// ordered by type and code; key = GroupCode, text = GroupName ("-" when empty). Throws Failure.
-QVector<CheckListModel::Row> readCardGroups(const DatabaseClient& client, const QString& connString, short cardType);
+// Appends to rows the card groups of a card type (cmbCS index; leads list the customer groups,
+// -1 all groups), ordered by type and code; key = GroupCode, text = GroupName ("-" when empty).
+// Throws Failure; the rows appended before stay.
+void readCardGroups(const DatabaseClient& client, const QString& connString, short cardType,
+                    QVector<CheckListModel::Row>& rows);
 
-// The 64 card properties, row N for property N; text = the name OCQG gives it, "-" when it gives
-// none (also for a property OCQG does not list). Throws Failure.
-QVector<CheckListModel::Row> readProperties(const DatabaseClient& client, const QString& connString);
+// The 64 card properties, row N for property N, each named "-".
+QVector<CheckListModel::Row> unnamedProperties();
+// Names the properties OCQG names (a property it does not list stays "-"). Throws Failure; the
+// names given before stay.
+void nameProperties(const DatabaseClient& client, const QString& connString, QVector<CheckListModel::Row>& properties);
 
 // The cards the statement lists, handed over in batches as they are read: key and first text the
 // code without blanks around it (rows with an empty code are left out), second text the name

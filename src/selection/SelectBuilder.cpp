@@ -138,13 +138,19 @@ QString fromClause(const Criteria& c, short level, int pDocIndex, bool details, 
     return from;
 }
 
+// The card name as the column list takes it.
+QString nameKey(const Criteria& c, int pDocIndex, short kind)
+{
+    const DocTypeInfo doc = GetDocTypeInfo(pDocIndex);
+    return sourceOf(c, kind) == Source::Documents ? doc.TableName + u'.' + doc.NameField : u"OCRD.CardName"_s;
+}
+
 // The sort keys of the user's choice, first and (for two of the choices) second.
 QStringList sortKeys(const Criteria& c, int pDocIndex, short kind)
 {
-    const DocTypeInfo doc = GetDocTypeInfo(pDocIndex);
     const Source source = sourceOf(c, kind);
     const bool documents = source == Source::Documents;
-    const QString name = documents ? doc.TableName + u'.' + doc.NameField : u"OCRD.CardName"_s;
+    const QString name = nameKey(c, pDocIndex, kind);
     const QString city = documents ? u"MailCity"_s : source == Source::Card ? u"OCRD.City"_s : u"OCRD.MailCity"_s;
     const QString zip = documents ? u"MailZipCod"_s : source == Source::Card ? u"OCRD.ZipCode"_s : u"OCRD.MailZipCod"_s;
     switch (c.sortBy) {
@@ -171,10 +177,33 @@ struct SortPlan {
     QString extraColumns;
 };
 
+// A contact column added to a list that has none would give a row per contact; such a key is
+// left out (the card list then sorts by its other key, or by name).
+QStringList usableKeys(const QStringList& keys, const QString& columns, const QString& nameKey)
+{
+    if (lists(columns, u"OCPR.Name"_s))
+        return keys;
+    QStringList usable;
+    for (const QString& key : keys) {
+        if (!key.startsWith(u"OCPR."_s))
+            usable << key;
+    }
+    return usable.isEmpty() ? QStringList{nameKey} : usable;
+}
+
+// The columns the builder itself selects, without the user's own expressions, in which a sort key
+// is looked for.
+QString ownColumns(const Criteria& c, short level, int pDocIndex, bool details, short kind)
+{
+    Criteria plain = c;
+    plain.addressBySql = false;
+    return columnList(plain, level, pDocIndex, details, kind);
+}
+
 SortPlan sortPlan(const Criteria& c, const QString& columns, int pDocIndex, short kind)
 {
     SortPlan plan;
-    const QStringList keys = sortKeys(c, pDocIndex, kind);
+    const QStringList keys = usableKeys(sortKeys(c, pDocIndex, kind), columns, nameKey(c, pDocIndex, kind));
     for (int i = 0; i < keys.size(); ++i) {
         if (columns.isEmpty() || lists(columns, keys[i])) {
             plan.orderBy << keys[i];
@@ -202,7 +231,7 @@ QString direction(int sortDir)
 QString BuildSelect(const Criteria& c, short level, int pDocIndex, bool pAllDetails, short pOutType)
 {
     const QString columns = columnList(c, level, pDocIndex, pAllDetails, pOutType) + mergeColumns(c, pOutType);
-    const SortPlan plan = sortPlan(c, columns, pDocIndex, pOutType);
+    const SortPlan plan = sortPlan(c, ownColumns(c, level, pDocIndex, pAllDetails, pOutType), pDocIndex, pOutType);
     return columns + plan.extraColumns + fromClause(c, level, pDocIndex, pAllDetails, pOutType);
 }
 
@@ -211,7 +240,7 @@ QString BuildSelect(const Criteria& c, short level, int pDocIndex, bool pAllDeta
 QString BuildOrderBy(const Criteria& c, short level, int pDocIndex, short pOutType)
 {
     const bool details = pOutType != kCardList;
-    const QString columns = columnList(c, level, pDocIndex, details, pOutType) + mergeColumns(c, pOutType);
+    const QString columns = ownColumns(c, level, pDocIndex, details, pOutType);
     const QString dir = direction(c.sortDir);
     QStringList parts;
     for (const QString& key : sortPlan(c, columns, pDocIndex, pOutType).orderBy)

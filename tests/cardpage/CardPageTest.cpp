@@ -122,6 +122,14 @@ TEST_F(CardPageTest, CardTypesAndACodeWithAnApostrophe)
     EXPECT_EQ(page(u"C3"_s), kHead) << "a card without a group has no general row either";
 }
 
+TEST_F(CardPageTest, ASetPropertyWithoutANameStillGivesThePropertiesBlock)
+{
+    engine->createDatabase(u"unnamed"_s, handMadeCompany(900000, {
+        insertRow(u"OCRG"_s, {{u"GroupCode"_s, 100}, {u"GroupName"_s, u"g"_s}}),
+        insertRow(u"OCRD"_s, {{u"CardCode"_s, u"P1"_s}, {u"GroupCode"_s, 100}, {u"QryGroup9"_s, u"Y"_s}})}));
+    EXPECT_TRUE(page(u"P1"_s, u"unnamed"_s).contains(u"     <td class=Cap>מאפיינים</td>\r\n    </tr>\r\n    <tr align='right'>\r\n     <td></td>\r\n"_s));
+}
+
 TEST_F(CardPageTest, AnUnreadableSchemaLevelTouchesNoFile)
 {
     state.ConnDataBase = u"missing"_s;

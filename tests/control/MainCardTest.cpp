@@ -15,6 +15,7 @@
 #include <QPushButton>
 #include <QRadioButton>
 #include <QTabWidget>
+#include <QMouseEvent>
 
 using namespace Qt::StringLiterals;
 
@@ -153,6 +154,16 @@ TEST_F(MainCardTest, ClickingTheDepartmentLabelTwiceReturnsToTheFirstCaptionAndT
     card->LblDept_Click();
     EXPECT_EQ(c().LblDept->text(), u"מחלקה"_s);
     EXPECT_EQ(tagOf(c().LblDept), u"0"_s);
+
+    // A double click as the window system delivers it: press, release, double click, release.
+    const QPointF inside(2, 2);
+    for (const QEvent::Type type : {QEvent::MouseButtonPress, QEvent::MouseButtonRelease, QEvent::MouseButtonDblClick,
+                                    QEvent::MouseButtonRelease}) {
+        QMouseEvent event(type, inside, c().LblDept->mapToGlobal(inside), Qt::LeftButton,
+                          type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton, Qt::NoModifier);
+        QCoreApplication::sendEvent(c().LblDept, &event);
+    }
+    EXPECT_EQ(tagOf(c().LblDept), u"1"_s) << "a double click is one click";
 
     setTag(c().LblDept, u"7"_s);
     card->LblDept_Click();

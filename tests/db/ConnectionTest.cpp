@@ -43,6 +43,8 @@ TEST_P(ConnectionTest, TheSchemaLevelFollowsTheVersionInThousands)
                   level)
             << version;
     }
+    EXPECT_EQ(levelOf({u"CREATE TABLE CINF (Version DECIMAL(10,1))"_s, u"INSERT INTO CINF VALUES (930000.0)"_s}), 1)
+        << "a version stored as a decimal number";
     EXPECT_TRUE(messages.boxes.isEmpty());
 }
 

@@ -34,8 +34,8 @@ TEST_F(RunLogTest, AnEntryWithoutTitleHasTwoLinesAndAnEmptyTextStillItsLine)
 
 TEST_F(RunLogTest, MarkupInAStatementIsEscapedSoTheViewShowsItAsRun)
 {
-    WriteLog(u"SELECT * FROM OCRD WHERE a < 5 AND b = N'A&B'"_s, u"t"_s, kMorning);
-    EXPECT_TRUE(logText().contains(u"SELECT * FROM OCRD WHERE a &lt; 5 AND b = N'A&amp;B'<br>"_s));
+    WriteLog(u"SELECT * FROM OCRD WHERE a < 5 AND b = N'A&B \"q\"'"_s, u"t"_s, kMorning);
+    EXPECT_TRUE(logText().contains(u"SELECT * FROM OCRD WHERE a &lt; 5 AND b = N'A&amp;B \"q\"'<br>"_s));
 }
 
 TEST_F(RunLogTest, InitialisationEmptiesTheLogAndShowLogThenReportsItMissing)

@@ -1,3 +1,4 @@
+#include "common/Failure.h"
 #include "common/Windows1255.h"
 #include "outputs/LabelComposer.h"
 #include "outputs/LabelSheet.h"
@@ -180,6 +181,15 @@ TEST_F(LabelSheet, AnEmptyResultLeavesTheHeadOnly)
     c().TxtFromCrd->setText(u"X"_s);
     c().TxtToCrd->setText(u"X"_s);
     EXPECT_TRUE(sheet().endsWith(u"<BODY BGCOLOR='#FFFFFF'>\r\n"_s));
+}
+
+TEST_F(LabelSheet, AFailingStatementLeavesTheSheetAsFarAsItWasWritten)
+{
+    c().ChkUseSQLW->setChecked(true);
+    c().txtSQLWhere->setText(u"NoSuchColumn = 1"_s);
+    const QString path = tempPath(u"sheet.htm"_s);
+    EXPECT_THROW(card->CreateLabFile(path), Failure);
+    EXPECT_TRUE(fromWindows1255(readFile(path)).endsWith(u"<BODY BGCOLOR='#FFFFFF'>\r\n"_s));
 }
 
 TEST_F(LabelSheet, TheRunOpensTheSheetAndLogsTheCountingQuery)

@@ -92,6 +92,11 @@ TEST_F(PickersTest, AChoiceComesBackOnReopeningAndCancelKeepsTheStoredOne)
     }
     card->cmbCS_Validate();
     EXPECT_EQ(BuildWhere(Criteria{true, 1}, state), u" Where (1 > 0) AND OCRD.CardType = 'S'"_s);
+
+    state.SelCardGroups = {CardGroupSel{}, {100, false}, {101, false}, {102, false}, {103, false}, {104, false}, {199, true}};
+    state.GroupCardType = 1;
+    CardGroupDialog suppliers(services(), state, conn());
+    EXPECT_EQ(state.SelCardGroups.size(), 5) << "the selection is cut to the rows of the list";
 }
 
 TEST_F(PickersTest, TheGroupButtonNeedsACardTypeAndTicksTheCriterion)
@@ -162,6 +167,11 @@ TEST_F(PickersTest, TheCardPickerListsSearchesSortsAndStoresTheCheckedCodesInGri
     picker.cmdFindByDesc_Click();
     EXPECT_EQ(picker.model.checkedKeys().size(), 2) << "a search that finds nothing changes nothing";
 
+    CheckListModel numbers({u"n"_s}, {0});
+    numbers.setRows({{u"a"_s, {u"100"_s}}, {u"b"_s, {u"x"_s}}, {u"c"_s, {u"20"_s}}, {u"d"_s, {u"3.5"_s}}});
+    numbers.sortByText(0);
+    EXPECT_EQ(texts(numbers), (QStringList{u"3.5"_s, u"20"_s, u"100"_s, u"x"_s})) << "numbers by value";
+
     picker.cmdShowMarked_Click();
     EXPECT_EQ(texts(picker.model), (QStringList{u"c004"_s, u"C001"_s, u"C002"_s, u"C003"_s, u"C005"_s}));
     picker.cmdShowAll_Click();
@@ -217,6 +227,7 @@ TEST_F(CardFileTest, FieldsAreCutAtTabsWithTheFallbacksOfShortLines)
     EXPECT_EQ(readCardFile(file("A\tB\r\nX\tY\tZ\r\n"), 3, false), (QStringList{u"A"_s, u"Z"_s}))
         << "column 3 on a line with a single tab falls back to the first field";
     EXPECT_EQ(readCardFile(file("\xEF\xBB\xBF" "קוד\r\nא1\r\n"), 1, true), QStringList{u"א1"_s});
+    EXPECT_EQ(readCardFile(file("h\rC1\rC2"), 1, true), (QStringList{u"C1"_s, u"C2"_s})) << "carriage returns alone";
     EXPECT_EQ(readCardFile(file("\xf7\xe5\xe3\r\n\xe0" "1\r\n"), 1, true), QStringList{u"א1"_s}) << "windows-1255";
     EXPECT_THROW(cardFileColumn(u"two"_s), Failure);
     EXPECT_THROW(cardFileColumn(u"0"_s), Failure);

@@ -188,6 +188,23 @@ TEST(StatementText, ASortKeyOutsideTheListIsSelectedSoTheDatabaseAcceptsTheOrder
     EXPECT_EQ(BuildOrderBy(c, 1, 0, kMobiles), u" ORDER BY OCPR.Cellolar , OCRD.Cellular "_s);
 }
 
+TEST(StatementText, TheCardListNeverGainsAContactColumnAndUserExpressionsHideNoKey)
+{
+    Criteria c;
+    c.allContacts = true;
+    c.sortBy = 4;
+    EXPECT_TRUE(BuildSelect(c, 1, 0, false, kCardList).contains(u", OCRD.MailZipCod AS SortKey1 FROM"_s));
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, kCardList), u" ORDER BY SortKey1 ASC"_s);
+    c.sortBy = 5;
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, kCardList), u" ORDER BY SortKey1 ASC"_s);
+    EXPECT_FALSE(BuildSelect(c, 1, 0, false, kCardList).contains(u"OCPR.Cellolar"_s)) << "one row per card";
+
+    Criteria merged;
+    merged.sortBy = 5;
+    merged.mergeExpressions = {{u"'+' + OCRD.Cellular"_s, u"Field4"_s}};
+    EXPECT_TRUE(BuildSelect(merged, 1, 0, false, kFax).contains(u"OCRD.Cellular AS SortKey2"_s));
+}
+
 TEST(SelectedCards, TheListIsExactCaseSensitiveAndKeepsDuplicates)
 {
     SessionState state;

@@ -47,13 +47,14 @@ CardGroupDialog::CardGroupDialog(Services services, SessionState& state, const Q
     connect(buttons.cmdOK, &QPushButton::clicked, this, &CardGroupDialog::cmdOK_Click);
     connect(buttons.cmdCancel, &QPushButton::clicked, this, &QDialog::reject);
     layOut(*this, CardGroups, buttons);
+    QVector<CheckListModel::Row> groups;
     try {
-        model.setRows(readCardGroups(services_.database, connString, state_.GroupCardType));
+        readCardGroups(services_.database, connString, state_.GroupCardType, groups);
     } catch (const Failure& failure) {
         services_.messages.plain(failure.description());
     }
-    if (state_.SelCardGroups.size() < model.rowCount() + 1)
-        state_.SelCardGroups.resize(model.rowCount() + 1);
+    model.setRows(groups);
+    state_.SelCardGroups.resize(model.rowCount() + 1);
     UpdateGridByArray();
 }
 
@@ -94,11 +95,13 @@ QryGroupDialog::QryGroupDialog(Services services, SessionState& state, const QSt
     options->addWidget(Option1);
     options->addWidget(Option2);
     layOut(*this, QryGroups, buttons, relation);
+    QVector<CheckListModel::Row> properties = unnamedProperties();
     try {
-        model.setRows(readProperties(services.database, connString));
+        nameProperties(services.database, connString, properties);
     } catch (const Failure& failure) {
         services.messages.critical(u"תקלה"_s, failure.description());
     }
+    model.setRows(properties);
     UpdateGridByArray();
 }
 
