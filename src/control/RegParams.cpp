@@ -1,3 +1,4 @@
+#include "settings/SettingsStore.h"
 #include "common/Failure.h"
 #include "control/MainCard.h"
 #include "control/SetGetCtrl.h"
@@ -15,8 +16,6 @@ namespace pelmar {
 
 namespace {
 
-const QString kApp = u"Pelmar"_s;
-const QString kSection = u"Params"_s;
 const QString kFreeRowTag = u"5"_s;
 
 }  // namespace
@@ -25,7 +24,7 @@ void MainCard::SetGetRegParams(unsigned char action)
 {
     const auto key = [&](const QString& name, QObject* control, unsigned char prop, const QString& fallback) {
         try {
-            SetGetCtrl(action, services_.settings, kApp, kSection, name, control, prop, fallback);
+            SetGetCtrl(action, services_.settings, kPelmarApp, kParamsSection, name, control, prop, fallback);
         } catch (const Failure&) {
             // A key that cannot be written, read or assigned is skipped; the next one follows.
         }

@@ -16,8 +16,6 @@ namespace pelmar {
 
 namespace {
 
-const QString kApp = u"Pelmar"_s;
-const QString kParams = u"Params"_s;
 constexpr int kStartupLoginTimeout = 4;
 constexpr long kIgnoredOpenError = 3022;
 
@@ -25,15 +23,15 @@ constexpr long kIgnoredOpenError = 3022;
 
 void LoadConnSettings(const SettingsStore& store, SessionState& state)
 {
-    state.ConnServer = store.value(kApp, kParams, u"ConnServer"_s, u"server"_s);
-    state.ConnUID = store.value(kApp, kParams, u"ConnUID"_s, u"sa"_s);
-    state.ConnPWD = store.value(kApp, kParams, u"ConnPWD"_s, {});
-    state.ConnDataBase = store.value(kApp, kParams, u"ConnDataBase"_s, QString::fromUtf16(kUnconfiguredDatabase));
+    state.ConnServer = store.value(kPelmarApp, kParamsSection, u"ConnServer"_s, u"server"_s);
+    state.ConnUID = store.value(kPelmarApp, kParamsSection, u"ConnUID"_s, u"sa"_s);
+    state.ConnPWD = store.value(kPelmarApp, kParamsSection, u"ConnPWD"_s, {});
+    state.ConnDataBase = store.value(kPelmarApp, kParamsSection, u"ConnDataBase"_s, QString::fromUtf16(kUnconfiguredDatabase));
 }
 
 QString configuredSqlServerDriver(const SettingsStore& store)
 {
-    return store.value(kApp, kParams, u"SqlServerDriver"_s, {});
+    return store.value(kPelmarApp, kParamsSection, u"SqlServerDriver"_s, {});
 }
 
 QString companyConnString(const SessionState& state)

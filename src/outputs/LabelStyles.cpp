@@ -11,8 +11,6 @@ namespace pelmar {
 
 namespace {
 
-const QString kApp = u"Pelmar"_s;
-
 struct Field {
     const char16_t* key;
     unsigned char LabelDefRec::*member;
@@ -34,7 +32,7 @@ void save(SettingsStore& store, const QString& section, int line, const LabelDef
 {
     const auto write = [&](const QString& key, const QString& value) {
         try {
-            store.setValue(kApp, section, key, value);
+            store.setValue(kPelmarApp, section, key, value);
         } catch (const Failure&) {
             // A key that cannot be written is skipped; the others are still saved.
         }
@@ -48,12 +46,12 @@ void save(SettingsStore& store, const QString& section, int line, const LabelDef
 void load(const SettingsStore& store, const QString& section, int line, LabelDefRec& def)
 {
     for (const Field& field : kFields) {
-        const QString text = store.value(kApp, section, QString::fromUtf16(field.key), QString::number(field.fallback));
+        const QString text = store.value(kPelmarApp, section, QString::fromUtf16(field.key), QString::number(field.fallback));
         if (const auto value = byteValue(text))
             def.*field.member = *value;
     }
     if (hasFixedText(line))
-        def.FixedText = store.value(kApp, section, u"FixedText"_s, {});
+        def.FixedText = store.value(kPelmarApp, section, u"FixedText"_s, {});
 }
 
 QString fontName(unsigned char font)

@@ -4,6 +4,11 @@
 
 namespace pelmar {
 
+// The application every setting of the program lives under, and the section of the control's
+// options and connection settings.
+inline const QString kPelmarApp = QStringLiteral("Pelmar");
+inline const QString kParamsSection = QStringLiteral("Params");
+
 // The per-user settings store: application -> section -> key -> text value.
 // Each application is one file "<folder>/<application>.conf" in the native (INI) format, with
 // one group per section. The file is created readable by its owner only, because it holds the

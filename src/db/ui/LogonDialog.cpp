@@ -1,3 +1,4 @@
+#include "settings/SettingsStore.h"
 #include "db/ui/LogonDialog.h"
 
 #include "common/Failure.h"
@@ -146,7 +147,7 @@ void LogonDialog::SetGetRegConnParams(unsigned char action)
                                                     {u"ConnDataBase"_s, txtConnDatabase}};
     for (const auto& [key, box] : keys) {
         try {
-            SetGetCtrl(action, services_.settings, u"Pelmar"_s, u"Params"_s, key, box, kPropText, {});
+            SetGetCtrl(action, services_.settings, kPelmarApp, kParamsSection, key, box, kPropText, {});
         } catch (const Failure&) {
             // A key that cannot be written is skipped; the next one is still saved.
         }

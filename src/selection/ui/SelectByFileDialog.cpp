@@ -1,3 +1,4 @@
+#include "settings/SettingsStore.h"
 #include "selection/ui/SelectByFileDialog.h"
 
 #include "common/Failure.h"
@@ -81,7 +82,7 @@ void SelectByFileDialog::SetGetImportParams(unsigned char action)
         {u"IgnoreFirstLine"_s, ChkIgnoreFirstLine, kPropValue, u"1"_s}};
     for (const auto& [key, control, prop, fallback] : keys) {
         try {
-            SetGetCtrl(action, services_.settings, u"Pelmar"_s, u"ImportFile"_s, key, control, prop, fallback);
+            SetGetCtrl(action, services_.settings, kPelmarApp, u"ImportFile"_s, key, control, prop, fallback);
         } catch (const Failure&) {
             // A key that cannot be read or written is passed over; the next one follows.
         }
