@@ -20,11 +20,6 @@ QString TrimField(const QVariant& value)
     return text.mid(first, last - first);
 }
 
-QString FieldOrNbsp(const QVariant& value)
-{
-    return value.isNull() ? QStringLiteral("&nbsp;") : value.toString();
-}
-
 QVariant ValueOrDefault(const QVariant& value, const QVariant& fallback)
 {
     if (value.isNull() || value.toString().isEmpty())

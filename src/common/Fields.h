@@ -8,9 +8,6 @@ namespace pelmar {
 // A database value as text with leading and trailing blanks (spaces) removed; Null gives "".
 QString TrimField(const QVariant& value);
 
-// A database value as text, unchanged; Null gives "&nbsp;".
-QString FieldOrNbsp(const QVariant& value);
-
 // The value unless it is Null or the empty text, else the default.
 QVariant ValueOrDefault(const QVariant& value, const QVariant& fallback);
 

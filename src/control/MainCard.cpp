@@ -167,11 +167,6 @@ void MainCard::setProgress(long processed, long total)
     c_.ProgressFill->setGeometry(x, 0, width, c_.ProgressFrame->height());
 }
 
-void MainCard::setProgressText(const QString& text)
-{
-    c_.Message1->setText(text);
-}
-
 void MainCard::guarded(const std::function<void()>& handler)
 {
     try {

@@ -105,7 +105,6 @@ public:
 
     // Progress of a run: the fill gets processed / total of the frame's width; 0 clears it.
     void setProgress(long processed, long total);
-    void setProgressText(const QString& text);
 
     const MainCardControls& controls() const { return c_; }
     SessionState& state() { return state_; }
