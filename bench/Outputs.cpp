@@ -1,12 +1,15 @@
 #include "bench/Outputs.h"
 
 #include "common/SessionState.h"
-#include "outputs/LabelSheet.h"
-#include "outputs/RecipientList.h"
-#include "outputs/SmsList.h"
-#include "selection/Criteria.h"
+#include "db/DatabaseClient.h"
+#include "options/MailingOptions.h"
+#include "outputs/Output.h"
+#include "outputs/Runs.h"
 #include "selection/SelectBuilder.h"
-#include "selection/WhereBuilder.h"
+#include "settings/SettingsStore.h"
+#include "support/Fakes.h"
+
+#include <QTemporaryDir>
 
 using namespace Qt::StringLiterals;
 
@@ -14,60 +17,68 @@ namespace pelmar::bench {
 
 namespace {
 
-// The criteria of a plain run over every card: mailing address, sorted by card code.
-Criteria everyCard()
+// A plain run over every card: the mailing address, sorted by card code, every label line on.
+const MailingOptions& everyCard()
 {
-    Criteria criteria;
-    criteria.addressFrom = 0;
-    return criteria;
+    static const MailingOptions options = [] {
+        MailingOptions plain;
+        plain.addressFrom = 0;
+        plain.useTitle.fill(true);
+        return plain;
+    }();
+    return options;
 }
 
-QString statement(short kind, bool details, bool ordered)
+QString statement(const SessionState& state, short kind, bool details, bool ordered)
 {
-    const Criteria criteria = everyCard();
-    QString text = BuildSelect(criteria, 1, 0, details, kind) + BuildWhere(criteria, SessionState{});
-    if (ordered)
-        text += BuildOrderBy(criteria, 1, 0, kind);
-    return text;
+    SessionState newer = state;
+    newer.SboVersionLevel = 1;
+    return recipientStatement(everyCard(), newer, kind, details, ordered);
 }
 
-QStringList labelStatements()
+// Runs one operation of the outputs as the window would, with fakes for the boxes and dialogs.
+template <typename Operation>
+void runOperation(const DatabaseClient& client, SessionState& state, Operation operation)
 {
-    return {statement(kCardList, true, false), statement(kLabels, true, true)};
+    QTemporaryDir settings;
+    SettingsStore store(settings.path());
+    test::FakeMessages messages;
+    test::FakeBrowser browser;
+    test::FakeFileDialogs files;
+    test::FakeProgress progress;
+    StopToken stop(state.StopRequested);
+    RunContext context{everyCard(), state, {messages, browser, files, store, client}, progress, stop, {}};
+    operation(context);
 }
 
-void runLabels(const DatabaseClient& client, const QString& connString, const QString& path)
+QStringList labelStatements(const SessionState& state)
 {
-    LabelPage page;
-    page.rows = u"8"_s;
-    page.cols = u"3"_s;
-    page.start = u"1"_s;
-    page.copies = u"1"_s;
-    page.enabled.fill(true);
-    LabelDefTable styles{};
-    const QStringList statements = labelStatements();
-    writeLabelSheet(path, page, styles, LabelQueries{client, connString, statements[0], statements[1], {}});
+    return {statement(state, kCardList, true, false), statement(state, kLabels, true, true)};
 }
 
-QStringList listStatements()
+void runLabels(const DatabaseClient& client, SessionState& state, const QString& path)
 {
-    return {statement(kLabels, true, true)};
+    runOperation(client, state, [&](RunContext& context) { CreateLabFile(path, context); });
 }
 
-void runList(const DatabaseClient& client, const QString& connString, const QString& path)
+QStringList listStatements(const SessionState& state)
 {
-    writeRecipientList(path, kLabels, ListQuery{client, connString, listStatements()[0], {}}, ListPageLayout{8, 3, 1},
-                       QDate::currentDate());
+    return {statement(state, kLabels, true, true)};
 }
 
-QStringList smsStatements()
+void runList(const DatabaseClient& client, SessionState& state, const QString& path)
 {
-    return {statement(kMobiles, true, true)};
+    runOperation(client, state, [&](RunContext& context) { CreateHTML(path, kLabels, context); });
 }
 
-void runSms(const DatabaseClient& client, const QString& connString, const QString& path)
+QStringList smsStatements(const SessionState& state)
 {
-    writeSmsList(path, ListQuery{client, connString, smsStatements()[0], {}});
+    return {statement(state, kMobiles, true, true)};
+}
+
+void runSms(const DatabaseClient& client, SessionState& state, const QString& path)
+{
+    runOperation(client, state, [&](RunContext& context) { CreateSMSFile(path, context); });
 }
 
 }  // namespace

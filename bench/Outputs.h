@@ -5,16 +5,18 @@
 
 namespace pelmar {
 class DatabaseClient;
+struct SessionState;
 }
 
 namespace pelmar::bench {
 
 // One output measured by the runner: the statements it reads (the floor reads them to the end)
-// and the run itself, which writes its file to path.
+// and the run itself, through the operation the output's run button starts, writing its file to
+// path. The session holds the connection settings of the company measured.
 struct BenchOutput {
     QString name;
-    QStringList (*statements)();
-    void (*run)(const DatabaseClient& client, const QString& connString, const QString& path);
+    QStringList (*statements)(const SessionState& state);
+    void (*run)(const DatabaseClient& client, SessionState& state, const QString& path);
 };
 
 const QList<BenchOutput>& benchOutputs();

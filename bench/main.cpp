@@ -6,11 +6,13 @@
 //   pelmar_bench [--cards N,N,...] [--engines embedded,postgresql] [--outputs labels,...]
 //   pelmar_bench picker [CARDS]             the card picker's fill, sorts and search
 //   pelmar_bench generate FOLDER CARDS      an embedded company "bench" for profiling
-//   pelmar_bench measure floor|run OUTPUT DRIVER CONNSTRING      one measurement
+//   pelmar_bench measure floor|run OUTPUT DRIVER SERVER USER PASSWORD DATABASE   one measurement
 
 #include "bench/Outputs.h"
 #include "bench/Picker.h"
 #include "common/Failure.h"
+#include "common/SessionState.h"
+#include "db/Connection.h"
 #include "db/ConnString.h"
 #include "db/DatabaseClient.h"
 #include "demo/SqliteCompanyWriter.h"
@@ -51,13 +53,17 @@ void readToTheEnd(const DatabaseClient& client, const QString& connString, const
     }
 }
 
-// Child: "measure floor|run OUTPUT DRIVER CONNSTRING" prints "seconds peak_kb".
+// Child: "measure floor|run OUTPUT DRIVER SERVER USER PASSWORD DATABASE" prints "seconds peak_kb".
 int measure(const QStringList& args)
 {
     const QString mode = args.value(0);
     const bench::BenchOutput* output = bench::benchOutput(args.value(1));
     const DatabaseClient client(args.value(2));
-    const QString connString = args.value(3);
+    SessionState state;
+    state.ConnServer = args.value(3);
+    state.ConnUID = args.value(4);
+    state.ConnPWD = args.value(5);
+    state.ConnDataBase = args.value(6);
     if (!output)
         return 2;
     QTemporaryDir dir;
@@ -65,9 +71,9 @@ int measure(const QStringList& args)
     timer.start();
     try {
         if (mode == u"floor"_s)
-            readToTheEnd(client, connString, output->statements());
+            readToTheEnd(client, companyConnString(state), output->statements(state));
         else
-            output->run(client, connString, dir.filePath(u"out"_s));
+            output->run(client, state, dir.filePath(u"out"_s));
     } catch (const Failure& failure) {
         QTextStream(stderr) << failure.description() << Qt::endl;
         return 1;
@@ -97,7 +103,8 @@ Sample child(const QString& mode, const QString& output, const test::Engine& eng
     QProcess process;
     process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
     process.start(QCoreApplication::applicationFilePath(),
-                  {u"measure"_s, mode, output, engine.client().sqlServerDriver(), engine.connString(database)});
+                  {u"measure"_s, mode, output, engine.client().sqlServerDriver(), engine.server(), engine.user(),
+                   engine.password(), database});
     process.waitForFinished(-1);
     const QStringList fields = QString::fromUtf8(process.readAllStandardOutput()).split(u' ');
     if (process.exitCode() != 0 || fields.size() < 2)

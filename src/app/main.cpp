@@ -1,4 +1,4 @@
-#include "app/Cli.h"
+#include "cli/Cli.h"
 #include "common/SessionState.h"
 #include "control/MainCard.h"
 #include "control/RealServices.h"
@@ -14,19 +14,11 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// The window: the mailing control on a host window titled "Pelmar".
-int runWindow()
+void nameTheApplication()
 {
-    pelmar::RealServices real;
-    pelmar::SessionState state;
-    QMainWindow window;
-    window.setWindowTitle(u"Pelmar"_s);
-    auto* card = new pelmar::MainCard(real.services(), state, &window);
-    window.setCentralWidget(card);
-    card->UserControl_Initialize();
-    window.resize(1024, 720);
-    window.show();
-    return QApplication::exec();
+    QCoreApplication::setApplicationName(u"Pelmar"_s);
+    QCoreApplication::setOrganizationName(u"Pelmar"_s);
+    QCoreApplication::setApplicationVersion(QStringLiteral(PELMAR_VERSION));
 }
 
 // Qt warns on every start when the session has no runtime folder (a scheduled job, a container);
@@ -41,22 +33,33 @@ void ensureRuntimeFolder()
     qputenv("XDG_RUNTIME_DIR", folder.toLocal8Bit());
 }
 
+// The window: the mailing control on a host window titled "Pelmar".
+int runWindow(int argc, char* argv[])
+{
+    QApplication app(argc, argv);
+    nameTheApplication();
+    QApplication::setLayoutDirection(Qt::RightToLeft);
+    pelmar::RealServices real;
+    pelmar::SessionState state;
+    QMainWindow window;
+    window.setWindowTitle(u"Pelmar"_s);
+    auto* card = new pelmar::MainCard(real.services(), state, &window);
+    window.setCentralWidget(card);
+    card->UserControl_Initialize();
+    window.resize(1024, 720);
+    window.show();
+    return QApplication::exec();
+}
+
 }  // namespace
 
+// Any argument makes a command, which runs without a window and without Qt's GUI platform.
 int main(int argc, char* argv[])
 {
     ensureRuntimeFolder();
-    // Any argument makes a command, which runs without a display: the control is built on Qt's
-    // offscreen platform.
-    const bool command = argc > 1;
-    if (command && qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
-        qputenv("QT_QPA_PLATFORM", "offscreen");
-    QApplication app(argc, argv);
-    QApplication::setApplicationName(u"Pelmar"_s);
-    QApplication::setOrganizationName(u"Pelmar"_s);
-    QApplication::setApplicationVersion(QStringLiteral(PELMAR_VERSION));
-    QApplication::setLayoutDirection(Qt::RightToLeft);
-    if (command)
-        return pelmar::runCommandLine(QApplication::arguments().mid(1));
-    return runWindow();
+    if (argc <= 1)
+        return runWindow(argc, argv);
+    QCoreApplication app(argc, argv);
+    nameTheApplication();
+    return pelmar::runCommandLine(QCoreApplication::arguments().mid(1));
 }

@@ -2,7 +2,7 @@
 
 #include "common/Fields.h"
 #include "db/DatabaseClient.h"
-#include "outputs/HtmlFile.h"
+#include "common/TextFileWriter.h"
 #include "selection/WhereBuilder.h"
 
 #include <QStringList>
@@ -266,11 +266,11 @@ private:
 
 }  // namespace
 
-void CreateCardFile(const QString& pFileName, const QString& pCardCode, const DatabaseClient& client,
-                    const QString& connString, short level)
+void writeCardPage(const QString& path, const QString& cardCode, const DatabaseClient& client, const QString& connString,
+                   short level)
 {
-    TextFileWriter file(pFileName, true);
-    CardPageWriter page(file, client, connString, sqlText(pCardCode));
+    TextFileWriter file(path, true);
+    CardPageWriter page(file, client, connString, sqlText(cardCode));
     page.head();
     const auto properties = page.properties();
     if (!properties || !page.general(*properties))

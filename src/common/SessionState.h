@@ -25,10 +25,11 @@ struct LabelDefRec {
     bool operator==(const LabelDefRec&) const = default;
 };
 
-// The state the control's parts share for the life of the process: the connection settings,
-// the schema level, the stop flag, the hand-picked cards and the picker selections.
-// One instance is made by the program and handed to the control and its dialogs; tests make
-// their own, so no state leaks from one test into the next.
+// The state the parts of the program share for the life of the process: the connection
+// settings, the schema level, the stop flag, the hand-picked cards, the picker selections and the
+// label styles. One instance is made by the window or the command line and handed to the runs,
+// the control and its dialogs; tests make their own, so no state leaks from one test into the
+// next.
 struct SessionState {
     // Connection settings ("Params" keys of the same names).
     QString ConnServer;

@@ -1,17 +1,16 @@
 #include "control/MainCard.h"
 
-#include "common/Failure.h"
 #include "common/FileDialogs.h"
-#include "common/Messages.h"
 #include "common/SessionState.h"
-#include "control/ClickableLabel.h"
-#include "control/SetGetCtrl.h"
-#include "control/Tag.h"
+#include "control/OptionsBinder.h"
 #include "control/pages/Pages.h"
 #include "db/ui/LogonDialog.h"
+#include "options/OptionBindings.h"
 #include "outputs/ui/LabelStyleDialog.h"
 #include "selection/ui/SelectByFileDialog.h"
 #include "selection/ui/SelectCardDialog.h"
+#include "widgets/ClickableLabel.h"
+#include "widgets/Tag.h"
 
 #include <QComboBox>
 #include <QCoreApplication>
@@ -21,7 +20,6 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
-#include <QRadioButton>
 #include <QTabWidget>
 #include <QToolButton>
 #include <QVBoxLayout>
@@ -35,6 +33,8 @@ MainCard::MainCard(Services services, SessionState& state, QWidget* parent)
 {
     setObjectName(u"MainCard"_s);
     buildPages();
+    binder_ = std::make_unique<OptionsBinder>(*this, options_);
+    showOptions();
     connectHandlers();
 }
 
@@ -73,6 +73,18 @@ void MainCard::connectHandlers()
     connect(c_.cmdSelByFile, &QPushButton::clicked, this, &MainCard::cmdSelByFile_Click);
 }
 
+// The sales employee list takes its entries from the options before the options are shown.
+void MainCard::showOptions()
+{
+    {
+        const QSignalBlocker quiet(c_.CmbAgent);
+        c_.CmbAgent->clear();
+        for (const SalesEmployee& employee : options_.agents)
+            c_.CmbAgent->addItem(employee.name, employee.code);
+    }
+    binder_->show();
+}
+
 bool MainCard::eventFilter(QObject* watched, QEvent* event)
 {
     // The card type's groups belong to one type: leaving the list forgets the chosen groups.
@@ -89,7 +101,7 @@ void MainCard::cmbCS_Validate()
 
 void MainCard::CmdDef_Click()
 {
-    SetGetRegParams(kSave);
+    SetGetRegParams(1, services_.settings, options_);
 }
 
 void MainCard::CmdConnect_Click()
@@ -112,30 +124,20 @@ void MainCard::cmdStop_Click()
 
 void MainCard::LblDept_Click()
 {
-    const QString tag = tagOf(c_.LblDept);
-    if (tag.isEmpty() || tag == u"0"_s) {
-        c_.LblDept->setText(u"תפקיד"_s);
-        setTag(c_.LblDept, u"1"_s);
-    } else if (tag == u"1"_s) {
-        c_.LblDept->setText(u"מחלקה"_s);
-        setTag(c_.LblDept, u"0"_s);
-    }
+    if (options_.deptTag.isEmpty() || options_.deptTag == u"0"_s)
+        options_.deptTag = u"1"_s;
+    else if (options_.deptTag == u"1"_s)
+        options_.deptTag = u"0"_s;
+    setTag(c_.LblDept, options_.deptTag);
+    showDeptCaption();
 }
 
 void MainCard::showDeptCaption()
 {
-    const QString tag = tagOf(c_.LblDept);
-    if (tag.isEmpty() || tag == u"0"_s)
+    if (options_.deptTag.isEmpty() || options_.deptTag == u"0"_s)
         c_.LblDept->setText(u"מחלקה"_s);
-    else if (tag == u"1"_s)
+    else if (options_.deptTag == u"1"_s)
         c_.LblDept->setText(u"תפקיד"_s);
-}
-
-short MainCard::GetOLEOption() const
-{
-    if (c_.OptOLE[1]->isChecked())
-        return 1;
-    return c_.OptOLE[2]->isChecked() ? 2 : 0;
 }
 
 QString MainCard::PickOpenFile(int index)
@@ -159,23 +161,13 @@ void MainCard::CmdDir_Click(int index)
         targets[index]->setText(path);
 }
 
-void MainCard::setProgress(long processed, long total)
+void MainCard::report(const QString& text, double fraction)
 {
+    c_.Message1->setText(text);
     const int full = c_.ProgressFrame->width();
-    const int width = total > 0 ? qRound(double(processed) / double(total) * full) : 0;
+    const int width = qRound(fraction * full);
     const int x = layoutDirection() == Qt::RightToLeft ? full - width : 0;
     c_.ProgressFill->setGeometry(x, 0, width, c_.ProgressFrame->height());
-}
-
-void MainCard::guarded(const std::function<void()>& handler)
-{
-    try {
-        handler();
-    } catch (const Failure& failure) {
-        services_.messages.critical(u"תקלה"_s, failure.description());
-    } catch (const std::exception& error) {
-        services_.messages.critical(u"תקלה"_s, QString::fromLocal8Bit(error.what()));
-    }
 }
 
 }  // namespace pelmar

@@ -1,12 +1,10 @@
 #pragma once
 
+#include "common/Progress.h"
 #include "control/MainCardControls.h"
-#include "control/Services.h"
-#include "outputs/LabelSheet.h"
-#include "outputs/RecipientList.h"
-#include "selection/Criteria.h"
+#include "options/MailingOptions.h"
+#include "outputs/Services.h"
 
-#include <QDate>
 #include <QString>
 #include <QWidget>
 
@@ -15,71 +13,27 @@
 
 namespace pelmar {
 
+class OptionsBinder;
+class Output;
 class SelectByFileDialog;
 class SelectCardDialog;
+struct RunRequest;
 struct SessionState;
 
-// The mailing control: five pages of options, the output chosen in cmbOutType, and the buttons
-// that run it, preview its recipients and save the options. Everything runs on the user
-// interface thread; a run that yields (processEvents) lets the stop button set the stop flag.
-class MainCard : public QWidget {
+// The mailing control: five pages that show the options, the output chosen in cmbOutType, and
+// the buttons that run it, preview its recipients and save the options. The pages and the
+// options model are kept in step both ways; a run gets a copy of the options and the outputs of
+// the table do the work. Everything runs on the user interface thread: a run that yields between
+// recipients lets the stop button set the stop flag.
+class MainCard : public QWidget, public ProgressSink {
     Q_OBJECT
 public:
     MainCard(Services services, SessionState& state, QWidget* parent = nullptr);
     ~MainCard() override;
 
-    // Start-up: connection settings, run log, connection test and sales employees, every option,
-    // label styles, picker state, department caption, criteria page. Each step's failure is
-    // passed over. Runs again after the logon dialog.
+    // Start-up (see initialiseSession), then the pages show the options, the department caption
+    // follows its tag and the criteria page comes to the front. Runs again after the logon dialog.
     void UserControl_Initialize();
-
-    // 1 saves every option of the pages to section "Params", 2 loads them; other values walk the
-    // options and change nothing. A key that cannot be written, read or assigned is skipped.
-    void SetGetRegParams(unsigned char action);
-
-    // Refills CmbAgent from OSLP (item data = SlpCode); on any failure, or when OSLP is empty,
-    // the list keeps what it has.
-    void FillCmbAgent();
-
-    // The recipient query. BuildWhere throws Failure naming a criterion that cannot be read.
-    Criteria criteria() const;
-    QString BuildWhere() const;
-    QString BuildSelect(int pDocIndex, bool pAllDetails, short pOutType) const;
-    QString BuildOrderBy(int pDocIndex, short pOutType) const;
-    QString BuildDatesCriteria(const QDate& pFromDate, const QDate& pToDate, int pDocIndex, int pDocRelation,
-                               const QString& pFromDocNum, const QString& pToDocNum) const;
-    QString BuildItemsCriteria(const QString& pFromItem, const QString& pToItem) const;
-    QString BuildQryGroupCriteria() const;
-    // BuildSelect + BuildWhere (+ BuildOrderBy when ordered) with the chosen document type.
-    QString recipientStatement(short pOutType, bool pAllDetails, bool ordered) const;
-
-    // The selected-card list: the test and whether the outputs filter by it now.
-    bool IsSelectedCard(const QString& pCardCode) const;
-    bool selectionFilter() const;
-
-    // The label run: writes "pelmar1.htm" in the temporary folder and opens it in a new browser
-    // window. CreateLabFile writes the sheet to a path; false when the schema level could not be
-    // read (already reported) and nothing was written. Both throw Failure with the description
-    // the user sees; a layout box without a valid number fails before the file is touched.
-    void RunLabels();
-    bool CreateLabFile(const QString& pFileName);
-
-    // The recipient list of an output kind (2..6) written to a path; the preview writes
-    // "pelmar2.htm" in the temporary folder and opens it. False when the schema level could not
-    // be read (already reported) and nothing was written. Throws Failure.
-    bool CreateHTML(const QString& pFileName, short pOutType);
-
-    // The SMS run: asks for the file, writes the mobile numbers, says that the list is ready.
-    // A cancelled dialog is a failure (nothing written). CreateSMSFile is false when the schema
-    // level could not be read and nothing was written. Both throw Failure.
-    void SaveSMSList();
-    bool CreateSMSFile(const QString& pFileName);
-
-    // The page of one card; false when the schema level could not be read. Throws Failure.
-    bool CreateCardFile(const QString& pFileName, const QString& pCardCode);
-
-    // 1 when the WinFax option is chosen, else 2 for the fax service, else 0.
-    short GetOLEOption() const;
 
     // Button and label handlers.
     void CmdLabPrev_Click();
@@ -103,35 +57,31 @@ public:
     SelectCardDialog* cardPicker() const { return cardPicker_.get(); }
     SelectByFileDialog* fileDialog() const { return fileDialog_.get(); }
 
-    // Progress of a run: the fill gets processed / total of the frame's width; 0 clears it.
-    void setProgress(long processed, long total);
+    // The progress display: Message1 shows the text, the fill takes its share of the frame.
+    void report(const QString& text, double fraction) override;
 
     const MainCardControls& controls() const { return c_; }
-    SessionState& state() { return state_; }
-    const Services& services() const { return services_; }
+    const MailingOptions& options() const { return options_; }
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
-    struct OutputType;
-    static const OutputType& outputTypeAt(int listIndex);
-
-    LabelPage labelPage() const;
-    ListQuery listQuery(const QString& connString, short kind) const;
-    bool readSchemaLevel(QString& connString);
     void buildPages();
     void connectHandlers();
+    void showOptions();
     void showDeptCaption();
-    void runOutput(const OutputType& output);
-    void guarded(const std::function<void()>& handler);
+    // Runs an output on a copy of the options; false when it failed (the failure was shown).
+    bool runOutput(const Output& output, const RunRequest& request);
+    bool guarded(const std::function<void()>& handler);
     QString PickOpenFile(int index);
-
     void openCardPage(const QString& code);
 
     Services services_;
     SessionState& state_;
+    MailingOptions options_;
     MainCardControls c_;
+    std::unique_ptr<OptionsBinder> binder_;
     std::unique_ptr<SelectCardDialog> cardPicker_;
     std::unique_ptr<SelectByFileDialog> fileDialog_;
 };

@@ -1,7 +1,5 @@
-#include "common/BrowserWindow.h"
 #include "common/Messages.h"
 #include "common/SessionState.h"
-#include "common/TempFolder.h"
 #include "control/MainCard.h"
 #include "db/Connection.h"
 #include "selection/SelectBuilder.h"
@@ -10,7 +8,6 @@
 #include "selection/ui/SelectCardDialog.h"
 
 #include <QCheckBox>
-#include <QComboBox>
 
 using namespace Qt::StringLiterals;
 
@@ -23,11 +20,7 @@ void MainCard::cmdSelectAccount_Click()
     const bool rebuild = state_.CardListSQL.isEmpty()
                          || services_.messages.question(u"שימו לב"_s, u"לסרוק מחדש את רשימת הכרטיסים?"_s);
     if (rebuild) {
-        bool built = false;
-        guarded([&] {
-            state_.CardListSQL = recipientStatement(kCardList, false, true);
-            built = true;
-        });
+        const bool built = guarded([&] { state_.CardListSQL = recipientStatement(options_, state_, kCardList, false, true); });
         if (!built)
             return;
         cardPicker_.reset();
@@ -40,18 +33,9 @@ void MainCard::cmdSelectAccount_Click()
     cardPicker_->exec();
 }
 
-void MainCard::openCardPage(const QString& code)
-{
-    guarded([&] {
-        const QString path = tempFile(u"pelmar3.htm"_s);
-        if (CreateCardFile(path, code))
-            services_.browser.open(path);
-    });
-}
-
 void MainCard::CmdSelectGroup_Click()
 {
-    state_.GroupCardType = static_cast<short>(c_.cmbCS->currentIndex());
+    state_.GroupCardType = static_cast<short>(options_.cardType);
     if (state_.GroupCardType < 0)
         return;
     c_.ChkCatCode->setChecked(true);

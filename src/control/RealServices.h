@@ -1,13 +1,14 @@
 #pragma once
 
-#include "control/QtSeams.h"
-#include "control/Services.h"
+#include "common/DesktopBrowser.h"
 #include "db/DatabaseClient.h"
+#include "outputs/Services.h"
 #include "settings/SettingsStore.h"
+#include "widgets/QtSeams.h"
 
 namespace pelmar {
 
-// The composition root: the real outside systems of the program, owned here.
+// The composition root of the window: the real outside systems, owned here.
 class RealServices {
 public:
     RealServices();

@@ -1,14 +1,12 @@
 #include "db/Connection.h"
 
 #include "common/Failure.h"
-#include "common/Messages.h"
 #include "common/SessionState.h"
 #include "db/ConnString.h"
 #include "db/DatabaseClient.h"
 #include "settings/SettingsStore.h"
 
 #include <cmath>
-
 
 using namespace Qt::StringLiterals;
 
@@ -51,20 +49,15 @@ bool TestConnection(const DatabaseClient& client, const SessionState& state, con
     return true;
 }
 
-short GetSboVersionLevel(const DatabaseClient& client, const QString& connString, Messages& messages)
+short GetSboVersionLevel(const DatabaseClient& client, const QString& connString)
 {
-    try {
-        auto versions = client.open(u"SELECT Version FROM CINF"_s, connString);
-        bool numeric = false;
-        const double stored = versions->value(u"Version"_s).toString().trimmed().toDouble(&numeric);
-        if (!numeric || stored < INT32_MIN || stored > INT32_MAX)
-            throw Failure(u"Type mismatch: the company database's version is not a number."_s, 13);
-        const auto version = static_cast<qint32>(std::nearbyint(stored));
-        return version / 1000 >= 62 ? 1 : 0;
-    } catch (const Failure& failure) {
-        messages.critical(u"תקלה"_s, failure.description());
-        return -1;
-    }
+    auto versions = client.open(u"SELECT Version FROM CINF"_s, connString);
+    bool numeric = false;
+    const double stored = versions->value(u"Version"_s).toString().trimmed().toDouble(&numeric);
+    if (!numeric || stored < INT32_MIN || stored > INT32_MAX)
+        throw Failure(u"Type mismatch: the company database's version is not a number."_s, 13);
+    const auto version = static_cast<qint32>(std::nearbyint(stored));
+    return version / 1000 >= 62 ? 1 : 0;
 }
 
 }  // namespace pelmar

@@ -5,7 +5,6 @@
 namespace pelmar {
 
 class DatabaseClient;
-class Messages;
 class SettingsStore;
 struct SessionState;
 
@@ -25,9 +24,9 @@ QString companyConnString(const SessionState& state);
 bool TestConnection(const DatabaseClient& client, const SessionState& state, const QString& database);
 
 // Schema level of the company database: 1 when CINF.Version / 1000 is 62 or more, else 0.
-// When the version cannot be read, shows the failure in a critical box titled "תקלה" and
-// returns -1.
-short GetSboVersionLevel(const DatabaseClient& client, const QString& connString, Messages& messages);
+// Throws Failure describing why when the version cannot be read (the level is then -1 and the
+// caller stops: nothing may be written on a level that is not known).
+short GetSboVersionLevel(const DatabaseClient& client, const QString& connString);
 
 // The ODBC driver the settings name for SQL Server connections ("Params" key
 // "SqlServerDriver"); empty when none is named.

@@ -1,8 +1,6 @@
 #include "log/RunLog.h"
 
 #include "common/BrowserWindow.h"
-#include "common/Failure.h"
-#include "common/Messages.h"
 #include "common/TempFolder.h"
 #include "common/Windows1255.h"
 
@@ -49,19 +47,14 @@ void WriteLog(const QString& text, const QString& title, const QDateTime& now)
         log.write(toWindows1255(entry, true));
 }
 
-void ShowLog(BrowserWindow& browser, Messages& messages)
+bool ShowLog(BrowserWindow& browser)
 {
-    if (!QFile::exists(runLogPath())) {
-        messages.critical(u"הודעה"_s, u"היומן אינו נמצא"_s);
-        return;
-    }
+    if (!QFile::exists(runLogPath()))
+        return false;
     QFile::remove(runLogViewPath());
     QFile::copy(runLogPath(), runLogViewPath());
-    try {
-        browser.open(runLogViewPath());
-    } catch (const Failure& failure) {
-        messages.critical(u"תקלה"_s, failure.description());
-    }
+    browser.open(runLogViewPath());
+    return true;
 }
 
 }  // namespace pelmar

@@ -6,7 +6,6 @@
 namespace pelmar {
 
 class BrowserWindow;
-class Messages;
 
 // The run log: "pelmar.log" in the temporary folder, windows-1255 with CR LF, in which the runs
 // record the statements they execute. Every line ends with "<br>" so that its copy
@@ -23,8 +22,11 @@ void InitLog();
 // the view shows the statement as it was run.
 void WriteLog(const QString& text, const QString& title, const QDateTime& now = QDateTime::currentDateTime());
 
-// Copies the log over its view file and opens the view in a new browser window; with no log,
-// shows the critical box "היומן אינו נמצא" titled "הודעה".
-void ShowLog(BrowserWindow& browser, Messages& messages);
+// The message shown (titled "הודעה") when there is no log to show.
+inline constexpr char16_t kNoRunLog[] = u"היומן אינו נמצא";
+
+// Copies the log over its view file and opens the view in a new browser window. False when
+// there is no log, and nothing is opened; throws Failure when the browser cannot be opened.
+bool ShowLog(BrowserWindow& browser);
 
 }  // namespace pelmar

@@ -1,7 +1,8 @@
 #include "outputs/LabelComposer.h"
 
+#include "common/TextFileWriter.h"
 #include "db/Recordset.h"
-#include "outputs/HtmlFile.h"
+#include "options/MailingOptions.h"
 
 using namespace Qt::StringLiterals;
 
@@ -55,8 +56,8 @@ bool IsHebrew(QStringView text)
     return std::any_of(text.begin(), text.end(), [](QChar c) { return c.unicode() >= 0x05D0 && c.unicode() <= 0x05EA; });
 }
 
-LabelComposer::LabelComposer(const LabelPage& page, const LabelDefTable& styles, const Recordset& rows)
-    : page_(page), rows_(rows), fixedAbove_(styles[11].FixedText.left(kLineWidth)),
+LabelComposer::LabelComposer(const MailingOptions& options, const LabelDefTable& styles, const Recordset& rows)
+    : options_(options), rows_(rows), fixedAbove_(styles[11].FixedText.left(kLineWidth)),
       fixedBelow_(styles[12].FixedText.left(kLineWidth))
 {
     for (int column = 0; column < ColumnCount; ++column)
@@ -93,19 +94,19 @@ void LabelComposer::write(TextFileWriter& file) const
         lines[2].add(code, Html::Text);
     }
     if (const QStringView attn = trimmed(v[Attn]); !attn.isEmpty()) {
-        if (page_.showAttn)
+        if (options_.showAttn)
             lines[3].add(hebrew ? u"לידי:" : u"Attn:", Html::Markup);
         lines[3].add(attn, Html::Text);
         const QStringView department = trimmed(v[Department]);
-        if (page_.enabled[kDepartmentLine] && !department.isEmpty()) {
-            lines[3].add(page_.deptNewLine ? u"<br>" : u", ", Html::Markup);
+        if (options_.useTitle[kDepartmentLine] && !department.isEmpty()) {
+            lines[3].add(options_.deptNewLine ? u"<br>" : u", ", Html::Markup);
             lines[3].add(department, Html::Text);
         }
     }
     lines[11].add(fixedAbove_, Html::Text);
     lines[1].add(QStringView(v[CardName]).left(kLineWidth), Html::Text);
     lines[12].add(fixedBelow_, Html::Text);
-    if (page_.contactAddressAllowed && v[CntctAddrs].size() > 5) {
+    if (options_.allContacts && options_.useContactAddress && v[CntctAddrs].size() > 5) {
         lines[4].add(v[CntctAddrs], Html::TextCrCommaBr);
     } else {
         lines[4].add(trimmed(v[MailAddres]), Html::TextCrBr);
@@ -119,8 +120,8 @@ void LabelComposer::write(TextFileWriter& file) const
     lines[10].add(trimmed(v[MailCountry]), Html::Text);
 
     const auto& prefixes = hebrew ? hebrewPrefix_ : otherPrefix_;
-    for (const int line : page_.templateIndex == 1 ? kContactFirstOrder : kStandardOrder) {
-        if (line == kDepartmentLine || !page_.enabled[line] || lines[line].empty())
+    for (const int line : options_.labFormat == 1 ? kContactFirstOrder : kStandardOrder) {
+        if (line == kDepartmentLine || !options_.useTitle[line] || lines[line].empty())
             continue;
         file.bytes(prefixes[line]);
         for (int i = 0; i < lines[line].count; ++i)

@@ -10,11 +10,12 @@ namespace pelmar {
 
 class Recordset;
 class TextFileWriter;
+struct MailingOptions;
 
 // Composes the labels of a run from the rows of one recordset, whose columns it looks up once.
 class LabelComposer {
 public:
-    LabelComposer(const LabelPage& page, const LabelDefTable& styles, const Recordset& rows);
+    LabelComposer(const MailingOptions& options, const LabelDefTable& styles, const Recordset& rows);
 
     // Writes the current row's label: a line "    <tr class=L<i>><td>text</td></tr>" for each
     // enabled line whose text is not empty, in the template's order (line 6, the department,
@@ -27,7 +28,7 @@ private:
 
     QString text(Column column) const;
 
-    const LabelPage& page_;
+    const MailingOptions& options_;
     const Recordset& rows_;
     QString fixedAbove_;
     QString fixedBelow_;

@@ -3,7 +3,8 @@
 #include "common/Failure.h"
 #include "common/Fields.h"
 #include "db/DatabaseClient.h"
-#include "outputs/HtmlFile.h"
+#include "options/MailingOptions.h"
+#include "common/TextFileWriter.h"
 #include "outputs/LabelComposer.h"
 #include "outputs/RunParameters.h"
 
@@ -17,7 +18,7 @@ namespace {
 
 constexpr int kMaxShort = 32767;
 
-void writeHead(TextFileWriter& file, const LabelLayout& layout, const LabelPage& page, const LabelDefTable& styles)
+void writeHead(TextFileWriter& file, const LabelLayout& layout, const MailingOptions& options, const LabelDefTable& styles)
 {
     file.line(u"<HTML>"_s);
     file.line(u"<HEAD>"_s);
@@ -30,7 +31,7 @@ void writeHead(TextFileWriter& file, const LabelLayout& layout, const LabelPage&
               + u"%; vertical-align: middle; text-align: center}"_s);
     file.line(u" .TBL1 {padding: 1; border-spacing: 0; border-collapse: collapse; border: none; direction: rtl}"_s);
     for (int line = 0; line < 13; ++line) {
-        if (page.enabled[line]) {
+        if (options.useTitle[line]) {
             for (const QString& rule : labelStyleRules(line, styles[line]))
                 file.line(rule);
         }
@@ -104,16 +105,16 @@ private:
 
 }  // namespace
 
-LabelLayout LabelLayout::read(const LabelPage& page)
+LabelLayout LabelLayout::read(const MailingOptions& options)
 {
     LabelLayout layout{};
-    layout.cols = wholeNumberIn(page.cols, u"עמודות"_s, 1, kMaxShort);
-    layout.rows = wholeNumberIn(page.rows, u"שורות"_s, 1, kMaxShort);
-    layout.start = wholeNumberIn(page.start, u"התחל ממדבקה"_s, -kMaxShort - 1, kMaxShort);
+    layout.cols = wholeNumberIn(options.cols, u"עמודות"_s, 1, kMaxShort);
+    layout.rows = wholeNumberIn(options.rows, u"שורות"_s, 1, kMaxShort);
+    layout.start = wholeNumberIn(options.startFrom, u"התחל ממדבקה"_s, -kMaxShort - 1, kMaxShort);
     if (layout.rows * layout.cols > kMaxShort)
         throw Failure(u"דף של %1 שורות ו-%2 עמודות גדול מדי: מותרות עד %3 מדבקות בדף."_s.arg(layout.rows).arg(layout.cols).arg(kMaxShort),
                       6);
-    layout.copies = wholeNumberIn(page.copies, u"עותקים"_s, 0, 255);
+    layout.copies = wholeNumberIn(options.copies, u"עותקים"_s, 0, 255);
     return layout;
 }
 
@@ -123,11 +124,12 @@ QString cellSizeText(int cells)
     return u"%1.%2"_s.arg(tenths / 10, 2, 10, QChar(u'0')).arg(tenths % 10);
 }
 
-void writeLabelSheet(const QString& path, const LabelPage& page, const LabelDefTable& styles, const LabelQueries& queries)
+void writeLabelSheet(const QString& path, const MailingOptions& options, const LabelDefTable& styles,
+                     const LabelQueries& queries)
 {
-    const LabelLayout layout = LabelLayout::read(page);
+    const LabelLayout layout = LabelLayout::read(options);
     TextFileWriter file(path, true);
-    writeHead(file, layout, page, styles);
+    writeHead(file, layout, options, styles);
 
     auto counting = queries.client.open(queries.counting, queries.connString);
     if (counting->eof())
@@ -141,7 +143,7 @@ void writeLabelSheet(const QString& path, const LabelPage& page, const LabelDefT
     auto rows = queries.client.open(queries.labels, queries.connString);
     if (rows->eof())
         return file.close();
-    const LabelComposer composer(page, styles, *rows);
+    const LabelComposer composer(options, styles, *rows);
     CellWriter cells(file, layout, queries, composer, *rows);
     for (qint64 number = 1; number <= pages; ++number)
         cells.page(number);

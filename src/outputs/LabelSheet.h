@@ -4,27 +4,14 @@
 
 #include <QString>
 
-#include <array>
 #include <functional>
 
 namespace pelmar {
 
 class DatabaseClient;
+struct MailingOptions;
 
-// What the label page holds when a label run starts, as typed.
-struct LabelPage {
-    QString rows;
-    QString cols;
-    QString start;
-    QString copies;
-    std::array<bool, 13> enabled{};
-    bool contactAddressAllowed = false;  // all contacts and "prefer the contact's address" both on
-    bool showAttn = true;
-    bool deptNewLine = false;
-    int templateIndex = 0;
-};
-
-// The label page read into numbers. Throws Failure naming the box that holds no valid number:
+// The label page's layout boxes read into numbers. Throws Failure naming the box that holds no valid number:
 // rows and columns 1..32767 with rows × columns at most 32767, start -32768..32767, copies
 // 0..255.
 struct LabelLayout {
@@ -33,7 +20,7 @@ struct LabelLayout {
     int start;
     int copies;
 
-    static LabelLayout read(const LabelPage& page);
+    static LabelLayout read(const MailingOptions& options);
     int perPage() const { return rows * cols; }
 };
 
@@ -58,7 +45,7 @@ QString cellSizeText(int cells);
 // returns no row the file ends after its head. Values from the database and fixed texts are
 // HTML-escaped; the markup the sheet adds itself is not.
 // Throws Failure on a database or file failure; the file then holds what was written.
-void writeLabelSheet(const QString& path, const LabelPage& page, const LabelDefTable& styles,
+void writeLabelSheet(const QString& path, const MailingOptions& options, const LabelDefTable& styles,
                      const LabelQueries& queries);
 
 }  // namespace pelmar

@@ -2,7 +2,7 @@
 
 #include "common/Fields.h"
 #include "db/DatabaseClient.h"
-#include "outputs/HtmlFile.h"
+#include "common/TextFileWriter.h"
 
 #include <QList>
 

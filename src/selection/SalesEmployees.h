@@ -1,22 +1,17 @@
 #pragma once
 
-#include <QList>
 #include <QString>
-
-#include <optional>
 
 namespace pelmar {
 
 class DatabaseClient;
+struct MailingOptions;
 
-struct SalesEmployee {
-    QString name;  // OSLP.SlpName without leading and trailing blanks
-    int code = 0;  // OSLP.SlpCode
-};
-
-// The sales employees of OSLP in the order the table gives them, leaving out those without a
-// name. std::nullopt when the table has no rows (the caller then keeps the list it has).
-// Throws Failure when the database cannot be read.
-std::optional<QList<SalesEmployee>> readSalesEmployees(const DatabaseClient& client, const QString& connString);
+// Refills the sales employee list (options.agents) from OSLP, in the order the table gives the
+// rows, leaving out those without a name; as a list does when it is refilled, the first entry
+// is then chosen (nothing when no employee has a name). When OSLP has no rows, or the database
+// cannot be read, the list and the choice stay as they were: the sales employee criterion then
+// reports a missing choice when it is used.
+void FillCmbAgent(const DatabaseClient& client, const QString& connString, MailingOptions& options);
 
 }  // namespace pelmar

@@ -1,7 +1,10 @@
 #include "selection/SelectBuilder.h"
 
-#include "selection/Criteria.h"
+#include "common/SessionState.h"
+#include "options/Lists.h"
+#include "options/MailingOptions.h"
 #include "selection/DocTypes.h"
+#include "selection/WhereBuilder.h"
 
 #include <QRegularExpression>
 #include <QStringList>
@@ -20,21 +23,21 @@ bool isAddressKind(short kind)
 }
 
 // The address columns follow the document table only where the column list itself does.
-Source sourceOf(const Criteria& c, short kind)
+Source sourceOf(const MailingOptions& c, short kind)
 {
     if (c.addressFrom == 1)
         return Source::Card;
-    if (c.addressFrom == 2 && c.documentJoin() && isAddressKind(kind))
+    if (c.addressFrom == 2 && documentJoin(c) && isAddressKind(kind))
         return Source::Documents;
     return Source::Mailing;
 }
 
-QString deptField(const Criteria& c)
+QString deptField(const MailingOptions& c)
 {
     return c.deptTag == u"1"_s ? u"OCPR.Position"_s : u"OCPR.Notes1"_s;
 }
 
-QString addrSql(const Criteria& c)
+QString addrSql(const MailingOptions& c)
 {
     return c.addressBySql && !c.sqlAddress.isEmpty() ? u", "_s + c.sqlAddress + u" As MailAddres"_s : QString();
 }
@@ -53,7 +56,7 @@ QString nameTableColumns(short level, const QString& block, const QString& count
     return {};
 }
 
-QString addressColumns(const Criteria& c, short level, int pDocIndex, bool details, short kind)
+QString addressColumns(const MailingOptions& c, short level, int pDocIndex, bool details, short kind)
 {
     const DocTypeInfo doc = GetDocTypeInfo(pDocIndex);
     const QString contact = u", OCPR.Name Attn, "_s + deptField(c) + u" Department, OCPR.Address"_s;
@@ -82,7 +85,7 @@ QString addressColumns(const Criteria& c, short level, int pDocIndex, bool detai
     return {};
 }
 
-QString columnList(const Criteria& c, short level, int pDocIndex, bool details, short kind)
+QString columnList(const MailingOptions& c, short level, int pDocIndex, bool details, short kind)
 {
     switch (kind) {
     case kCardList:
@@ -103,22 +106,24 @@ QString columnList(const Criteria& c, short level, int pDocIndex, bool details, 
     }
 }
 
-QString mergeColumns(const Criteria& c, short kind)
+QString mergeColumns(const MailingOptions& c, short kind)
 {
     if (kind != kFax && kind != kLetters)
         return {};
     QString columns;
-    for (const MergeExpression& merge : c.mergeExpressions)
-        columns += u", "_s + merge.expression + u" As "_s + merge.alias;
+    for (int row = 0; row < mergeRows().size(); ++row) {
+        if (mergeRows()[row].free && c.faxField[row])
+            columns += u", "_s + c.faxExpr[row] + u" As "_s + mergeRows()[row].formField;
+    }
     return columns;
 }
 
-QString fromClause(const Criteria& c, short level, int pDocIndex, bool details, short kind)
+QString fromClause(const MailingOptions& c, short level, int pDocIndex, bool details, short kind)
 {
     const DocTypeInfo doc = GetDocTypeInfo(pDocIndex);
     const QString& t = doc.TableName;
     QString from;
-    if (c.documentJoin()) {
+    if (documentJoin(c)) {
         from = u" FROM (OCRD INNER JOIN "_s + t + u" ON OCRD.CardCode = "_s + t + u'.' + doc.CardField + u")"_s
                + u" LEFT JOIN OCPR ON"_s;
         from += doc.HasContact ? u" (OCPR.CardCode = "_s + t + u'.' + doc.CardField + u" And OCPR.CntctCode = "_s + t
@@ -139,14 +144,14 @@ QString fromClause(const Criteria& c, short level, int pDocIndex, bool details, 
 }
 
 // The card name as the column list takes it.
-QString nameKey(const Criteria& c, int pDocIndex, short kind)
+QString nameKey(const MailingOptions& c, int pDocIndex, short kind)
 {
     const DocTypeInfo doc = GetDocTypeInfo(pDocIndex);
     return sourceOf(c, kind) == Source::Documents ? doc.TableName + u'.' + doc.NameField : u"OCRD.CardName"_s;
 }
 
 // The sort keys of the user's choice, first and (for two of the choices) second.
-QStringList sortKeys(const Criteria& c, int pDocIndex, short kind)
+QStringList sortKeys(const MailingOptions& c, int pDocIndex, short kind)
 {
     const Source source = sourceOf(c, kind);
     const bool documents = source == Source::Documents;
@@ -193,14 +198,14 @@ QStringList usableKeys(const QStringList& keys, const QString& columns, const QS
 
 // The columns the builder itself selects, without the user's own expressions, in which a sort key
 // is looked for.
-QString ownColumns(const Criteria& c, short level, int pDocIndex, bool details, short kind)
+QString ownColumns(const MailingOptions& c, short level, int pDocIndex, bool details, short kind)
 {
-    Criteria plain = c;
+    MailingOptions plain = c;
     plain.addressBySql = false;
     return columnList(plain, level, pDocIndex, details, kind);
 }
 
-SortPlan sortPlan(const Criteria& c, const QString& columns, int pDocIndex, short kind)
+SortPlan sortPlan(const MailingOptions& c, const QString& columns, int pDocIndex, short kind)
 {
     SortPlan plan;
     const QStringList keys = usableKeys(sortKeys(c, pDocIndex, kind), columns, nameKey(c, pDocIndex, kind));
@@ -228,7 +233,12 @@ QString direction(int sortDir)
 
 }  // namespace
 
-QString BuildSelect(const Criteria& c, short level, int pDocIndex, bool pAllDetails, short pOutType)
+bool documentJoin(const MailingOptions& options)
+{
+    return options.dates && options.byDoc != 1;
+}
+
+QString BuildSelect(const MailingOptions& c, short level, int pDocIndex, bool pAllDetails, short pOutType)
 {
     const QString columns = columnList(c, level, pDocIndex, pAllDetails, pOutType) + mergeColumns(c, pOutType);
     const SortPlan plan = sortPlan(c, ownColumns(c, level, pDocIndex, pAllDetails, pOutType), pDocIndex, pOutType);
@@ -237,7 +247,7 @@ QString BuildSelect(const Criteria& c, short level, int pDocIndex, bool pAllDeta
 
 // Every caller that orders asks for the details of kinds 2 to 6 and for the plain card list of
 // kind 1, so that is the column list the keys are looked up in.
-QString BuildOrderBy(const Criteria& c, short level, int pDocIndex, short pOutType)
+QString BuildOrderBy(const MailingOptions& c, short level, int pDocIndex, short pOutType)
 {
     const bool details = pOutType != kCardList;
     const QString columns = ownColumns(c, level, pDocIndex, details, pOutType);
@@ -246,6 +256,16 @@ QString BuildOrderBy(const Criteria& c, short level, int pDocIndex, short pOutTy
     for (const QString& key : sortPlan(c, columns, pDocIndex, pOutType).orderBy)
         parts << key + u' ' + dir;
     return u" ORDER BY "_s + parts.join(u", "_s);
+}
+
+QString recipientStatement(const MailingOptions& options, const SessionState& state, short pOutType, bool pAllDetails,
+                           bool ordered)
+{
+    const short level = state.SboVersionLevel;
+    QString statement = BuildSelect(options, level, options.docType, pAllDetails, pOutType) + BuildWhere(options, state);
+    if (ordered)
+        statement += BuildOrderBy(options, level, options.docType, pOutType);
+    return statement;
 }
 
 }  // namespace pelmar

@@ -2,7 +2,7 @@
 
 #include "common/Failure.h"
 #include "common/SessionState.h"
-#include "selection/Criteria.h"
+#include "options/MailingOptions.h"
 #include "selection/DateText.h"
 #include "selection/DocTypes.h"
 
@@ -14,9 +14,9 @@ namespace pelmar {
 
 namespace {
 
-QString cardGroupsFragment(const Criteria& criteria, const SessionState& state)
+QString cardGroupsFragment(const MailingOptions& options, const SessionState& state)
 {
-    QString fragment = u" AND OCRD.CardType = '"_s + CardTypeCode(criteria.cardType, false) + u"'"_s;
+    QString fragment = u" AND OCRD.CardType = '"_s + CardTypeCode(options.cardType, false) + u"'"_s;
     QString groups;
     for (qsizetype i = 1; i < state.SelCardGroups.size(); ++i) {
         if (!state.SelCardGroups[i].Selected)
@@ -39,6 +39,14 @@ QString phoneColumn(int phoneType)
     case 4: return u"OCPR.Cellolar"_s;
     default: return u"OCRD.Phone1"_s;
     }
+}
+
+// The code of the chosen sales employee.
+int agentCode(const MailingOptions& options)
+{
+    if (options.agentIndex < 0 || options.agentIndex >= options.agents.size())
+        throw Failure(u"נבחר סינון לפי סוכן, אך לא נבחר סוכן מהרשימה. יש לבחור סוכן או לבטל את הסינון."_s);
+    return options.agents.at(options.agentIndex).code;
 }
 
 QString documentNumber(const QString& text, const QString& which)
@@ -103,7 +111,7 @@ QString BuildQryGroupCriteria(const SessionState& state)
     return u" And ("_s + list + u")"_s;
 }
 
-QString BuildWhere(const Criteria& c, const SessionState& state)
+QString BuildWhere(const MailingOptions& c, const SessionState& state)
 {
     QString where = u" Where (1 > 0)"_s;
     if (c.catCode)
@@ -116,11 +124,8 @@ QString BuildWhere(const Criteria& c, const SessionState& state)
     }
     if (c.phone)
         where += u" AND "_s + phoneColumn(c.phoneType) + u" LIKE N'"_s + sqlText(c.phonePrefix) + u"%'"_s;
-    if (c.agent) {
-        if (!c.agentCode)
-            throw Failure(u"נבחר סינון לפי סוכן, אך לא נבחר סוכן מהרשימה. יש לבחור סוכן או לבטל את הסינון."_s);
-        where += u" AND OCRD.SlpCode = "_s + QString::number(*c.agentCode);
-    }
+    if (c.agent)
+        where += u" AND OCRD.SlpCode = "_s + QString::number(agentCode(c));
     if (c.dates)
         where += BuildDatesCriteria(DateFromText(c.fromDate), DateFromText(c.toDate), c.docType, c.byDoc, c.fromDocNum,
                                     c.toDocNum);

@@ -1,5 +1,7 @@
 #include "common/Windows1255.h"
-#include "outputs/LabelFixture.h"
+#include "common/Failure.h"
+#include "outputs/Runs.h"
+#include "support/LabelCompany.h"
 
 using namespace Qt::StringLiterals;
 
@@ -12,7 +14,8 @@ protected:
     {
         state.ConnDataBase = database;
         const QString path = tempPath(u"card.htm"_s);
-        EXPECT_TRUE(card->CreateCardFile(path, code));
+        RunContext run = context();
+        CreateCardFile(path, code, run);
         return fromWindows1255(readFile(path));
     }
 };
@@ -135,7 +138,8 @@ TEST_F(CardPageTest, AnUnreadableSchemaLevelTouchesNoFile)
     state.ConnDataBase = u"missing"_s;
     const QString path = tempPath(u"card.htm"_s);
     writeFile(path, "previous");
-    EXPECT_FALSE(card->CreateCardFile(path, u"C1"_s));
+    RunContext run = context();
+    EXPECT_THROW(CreateCardFile(path, u"C1"_s, run), Failure);
     EXPECT_EQ(readFile(path), QByteArray("previous"));
 }
 

@@ -1,4 +1,4 @@
-#include "support/MainCardFixture.h"
+#include "support/ui/WindowFixture.h"
 
 #include <QComboBox>
 
@@ -16,7 +16,7 @@ class Dispatcher : public MainCardTest, public ::testing::WithParamInterface<Out
 
 TEST_P(Dispatcher, AsksTheOutputsOwnQuestionAndNoStartsNothingButClearsTheStopFlag)
 {
-    c().cmbOutType->setCurrentIndex(GetParam().listIndex);
+    control<QComboBox>(u"cmbOutType"_s)->setCurrentIndex(GetParam().listIndex);
     state.StopRequested = true;
     messages.answers = {false};
     card->CmdLabPrev_Click();
@@ -39,7 +39,7 @@ TEST_F(MainCardTest, AnOutputThatIsNotAvailableSaysSoAndShowsNoFinishMessage)
 {
     for (const int index : {1, 2, 4}) {
         messages.boxes.clear();
-        c().cmbOutType->setCurrentIndex(index);
+        control<QComboBox>(u"cmbOutType"_s)->setCurrentIndex(index);
         card->CmdLabPrev_Click();
         ASSERT_EQ(messages.boxes.size(), 2) << index;
         EXPECT_EQ(messages.boxes[1].kind, u"information"_s);
@@ -49,7 +49,7 @@ TEST_F(MainCardTest, AnOutputThatIsNotAvailableSaysSoAndShowsNoFinishMessage)
 
 TEST_F(MainCardTest, AFailingRunIsReportedAndShowsNoFinishMessage)
 {
-    c().cmbOutType->setCurrentIndex(3);
+    control<QComboBox>(u"cmbOutType"_s)->setCurrentIndex(3);
     card->CmdLabPrev_Click();
     ASSERT_EQ(messages.boxes.size(), 2) << "the save dialog was cancelled";
     EXPECT_EQ(messages.boxes[1].kind, u"critical"_s);

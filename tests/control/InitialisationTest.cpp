@@ -1,8 +1,7 @@
-#include "support/MainCardFixture.h"
-#include "db/ConnString.h"
 #include "log/RunLog.h"
 #include "support/Engines.h"
-#include "support/ModalCloser.h"
+#include "support/ui/ModalCloser.h"
+#include "support/ui/WindowFixture.h"
 
 #include <QComboBox>
 #include <QFile>
@@ -15,12 +14,12 @@ namespace {
 
 class Initialisation : public MainCardTest {
 protected:
-    void pointAt(const QString& database)
+    void pointAt(const QString& company)
     {
         for (const auto& [key, value] : {std::pair{u"ConnServer"_s, engine->server()},
                                          std::pair{u"ConnUID"_s, engine->user()},
                                          std::pair{u"ConnPWD"_s, engine->password()},
-                                         std::pair{u"ConnDataBase"_s, database}})
+                                         std::pair{u"ConnDataBase"_s, company}})
             store->setValue(u"Pelmar"_s, u"Params"_s, key, value);
     }
 
@@ -59,13 +58,13 @@ TEST_F(Initialisation, AnUnreachableCompanyLeavesTheControlUsable)
     card->UserControl_Initialize();
     EXPECT_EQ(c().CmbAgent->count(), 0);
     EXPECT_TRUE(messages.boxes.isEmpty());
-    EXPECT_EQ(c().txtRows->text(), u"8"_s);
+    EXPECT_EQ(control<QLineEdit>(u"txtRows"_s)->text(), u"8"_s);
 }
 
 TEST_F(Initialisation, ClosingTheLogonDialogReloadsTheStoredSettingsAndEmptiesTheLog)
 {
     card->UserControl_Initialize();
-    c().txtRows->setText(u"99"_s);
+    control<QLineEdit>(u"txtRows"_s)->setText(u"99"_s);
     WriteLog(u"SELECT 1"_s, u"t"_s);
     QString seenTitle;
     const ModalCloser closer([&](QDialog& dialog) {
@@ -74,7 +73,7 @@ TEST_F(Initialisation, ClosingTheLogonDialogReloadsTheStoredSettingsAndEmptiesTh
     });
     card->CmdConnect_Click();
     EXPECT_EQ(seenTitle, u"Connect to SAP Business One"_s);
-    EXPECT_EQ(c().txtRows->text(), u"8"_s);
+    EXPECT_EQ(control<QLineEdit>(u"txtRows"_s)->text(), u"8"_s);
     EXPECT_FALSE(QFile::exists(runLogPath()));
 }
 

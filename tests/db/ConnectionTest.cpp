@@ -1,7 +1,8 @@
+#include "common/Failure.h"
 #include "common/SessionState.h"
+#include "db/CompanyList.h"
 #include "db/Connection.h"
 #include "support/Engines.h"
-#include "support/Fakes.h"
 #include "support/PgCluster.h"
 
 #include <QElapsedTimer>
@@ -18,7 +19,7 @@ protected:
     short levelOf(const QStringList& statements)
     {
         engine->createDatabase(u"versiontest"_s, statements);
-        return GetSboVersionLevel(engine->client(), engine->connString(u"versiontest"_s), messages);
+        return GetSboVersionLevel(engine->client(), engine->connString(u"versiontest"_s));
     }
 
     SessionState stateFor(const QString& database) const
@@ -31,8 +32,18 @@ protected:
         return state;
     }
 
+    // The description of the failure reading the level; empty when it was read.
+    QString failureOf(const QStringList& statements)
+    {
+        try {
+            levelOf(statements);
+        } catch (const Failure& failure) {
+            return failure.description();
+        }
+        return {};
+    }
+
     std::unique_ptr<Engine> engine;
-    FakeMessages messages;
 };
 
 TEST_P(ConnectionTest, TheSchemaLevelFollowsTheVersionInThousands)
@@ -45,20 +56,13 @@ TEST_P(ConnectionTest, TheSchemaLevelFollowsTheVersionInThousands)
     }
     EXPECT_EQ(levelOf({u"CREATE TABLE CINF (Version DECIMAL(10,1))"_s, u"INSERT INTO CINF VALUES (930000.0)"_s}), 1)
         << "a version stored as a decimal number";
-    EXPECT_TRUE(messages.boxes.isEmpty());
 }
 
-TEST_P(ConnectionTest, AnUnreadableVersionGivesMinusOneAndTheCriticalMessage)
+TEST_P(ConnectionTest, AnUnreadableVersionIsAFailureThatSaysWhy)
 {
-    EXPECT_EQ(levelOf({u"CREATE TABLE OCRD (CardCode VARCHAR(15))"_s}), -1);
-    ASSERT_EQ(messages.boxes.size(), 1);
-    EXPECT_EQ(messages.boxes[0].kind, u"critical"_s);
-    EXPECT_EQ(messages.boxes[0].title, u"תקלה"_s);
-    EXPECT_TRUE(messages.boxes[0].text.contains(u"cinf"_s, Qt::CaseInsensitive)) << messages.boxes[0];
-
-    messages.boxes.clear();
-    EXPECT_EQ(levelOf({u"CREATE TABLE CINF (Version VARCHAR(10))"_s, u"INSERT INTO CINF VALUES ('nine')"_s}), -1);
-    EXPECT_EQ(messages.boxes.size(), 1);
+    EXPECT_TRUE(failureOf({u"CREATE TABLE OCRD (CardCode VARCHAR(15))"_s}).contains(u"cinf"_s, Qt::CaseInsensitive));
+    EXPECT_EQ(failureOf({u"CREATE TABLE CINF (Version VARCHAR(10))"_s, u"INSERT INTO CINF VALUES ('nine')"_s}),
+              u"Type mismatch: the company database's version is not a number."_s);
 }
 
 TEST_P(ConnectionTest, TheStartUpTestOpensTheSavedCompanyOrAnotherNamedOne)
@@ -68,6 +72,12 @@ TEST_P(ConnectionTest, TheStartUpTestOpensTheSavedCompanyOrAnotherNamedOne)
     EXPECT_TRUE(TestConnection(engine->client(), state, QString()));
     EXPECT_TRUE(TestConnection(engine->client(), stateFor(u"other"_s), u"company1"_s));
     EXPECT_FALSE(TestConnection(engine->client(), state, u"nosuchcompany"_s));
+}
+
+TEST(LogonCheck, AnEmptyDatabaseBoxIsOneEmptyNameAndSemicolonsKeepEmptyPieces)
+{
+    EXPECT_EQ(databasesToCheck(u"  "_s), QStringList{QString()});
+    EXPECT_EQ(databasesToCheck(u"a;;b"_s), (QStringList{u"a"_s, QString(), u"b"_s}));
 }
 
 INSTANTIATE_TEST_SUITE_P(Engines, ConnectionTest, ::testing::Values(&makeSqliteEngine, &makePostgresEngine),

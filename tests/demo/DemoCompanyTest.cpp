@@ -4,7 +4,6 @@
 #include "db/DatabaseClient.h"
 #include "demo/DemoCompany.h"
 #include "settings/SettingsStore.h"
-#include "support/Fakes.h"
 #include "support/Isolated.h"
 
 #include <QFile>
@@ -31,8 +30,7 @@ TEST_F(DemoCompanyTest, AFreshInstallationIsPointedAtTheDemoCompany)
     SessionState state;
     LoadConnSettings(store, state);
     const DatabaseClient client{QString()};
-    FakeMessages messages;
-    EXPECT_EQ(GetSboVersionLevel(client, companyConnString(state), messages), 1);
+    EXPECT_EQ(GetSboVersionLevel(client, companyConnString(state)), 1);
     auto cards = client.open(u"SELECT COUNT(*) AS N FROM OCRD"_s, companyConnString(state));
     EXPECT_GE(cards->value(u"N"_s).toInt(), 200);
     auto companies = client.open(u"SELECT dbName FROM SRGC"_s,

@@ -3,7 +3,8 @@
 #include "outputs/LabelComposer.h"
 #include "outputs/LabelSheet.h"
 #include "outputs/LabelStyles.h"
-#include "outputs/LabelFixture.h"
+#include "outputs/Runs.h"
+#include "support/LabelCompany.h"
 
 #include <QFile>
 #include <QRegularExpression>
@@ -19,15 +20,16 @@ protected:
     {
         LabelCompanyTest::SetUp();
         SetGetLabelDefs(2, *store, state.LabelDefs);
-        c().txtRows->setText(u"3"_s);
-        c().txtCols->setText(u"2"_s);
+        options.rows = u"3"_s;
+        options.cols = u"2"_s;
         lines({0, 1, 2, 3, 4, 5, 6});
     }
 
     QString sheet()
     {
         const QString path = tempPath(u"sheet.htm"_s);
-        EXPECT_TRUE(card->CreateLabFile(path));
+        RunContext run = context();
+        CreateLabFile(path, run);
         const QByteArray bytes = readFile(path);
         EXPECT_FALSE(bytes.contains("\n") && bytes.count("\r\n") != bytes.count("\n")) << "every line ends with CR LF";
         return fromWindows1255(bytes);
@@ -104,10 +106,10 @@ TEST_F(LabelSheet, ASheetIsWrittenByteForByte)
 TEST_F(LabelSheet, TheStartPositionLeavesCellsOfTheFirstPageBlank)
 {
     lines({2});
-    c().txtStartFrom->setText(u"5"_s);
+    options.startFrom = u"5"_s;
     EXPECT_EQ(cells(sheet()), (QStringList{u"-"_s, u"-"_s, u"-"_s, u"-"_s, u"קוד: C1"_s, u"Code: C2"_s,
                                            u"קוד: C3"_s, u"Code: C4"_s, u"קוד: C5"_s, u"-"_s, u"-"_s, u"-"_s}));
-    c().txtStartFrom->setText(u"8"_s);
+    options.startFrom = u"8"_s;
     const QStringList beyond = cells(sheet());
     ASSERT_EQ(beyond.size(), 12) << "start 8 of 6 cells: positions 1..12 over two pages";
     EXPECT_EQ(beyond.mid(0, 6), QStringList(6, u"-"_s));
@@ -117,15 +119,15 @@ TEST_F(LabelSheet, TheStartPositionLeavesCellsOfTheFirstPageBlank)
 TEST_F(LabelSheet, CopiesFillConsecutiveCellsAndZeroCopiesWriteNoPage)
 {
     lines({2});
-    c().txtCopies->setText(u"3"_s);
-    c().txtStartFrom->setText(u"2"_s);
+    options.copies = u"3"_s;
+    options.startFrom = u"2"_s;
     const QStringList copies = cells(sheet());
     ASSERT_EQ(copies.size(), 18) << "3 × (2 + 5 - 1) positions make three pages of six";
     EXPECT_EQ(copies.mid(0, 8), (QStringList{u"-"_s, u"קוד: C1"_s, u"קוד: C1"_s, u"קוד: C1"_s, u"Code: C2"_s,
                                              u"Code: C2"_s, u"Code: C2"_s, u"קוד: C3"_s}));
     EXPECT_EQ(copies.mid(16), (QStringList{u"-"_s, u"-"_s}));
 
-    c().txtCopies->setText(u"0"_s);
+    options.copies = u"0"_s;
     const QString none = sheet();
     EXPECT_TRUE(cells(none).isEmpty());
     EXPECT_TRUE(none.endsWith(u"<BODY BGCOLOR='#FFFFFF'>\r\n</BODY>\r\n</HTML>\r\n"_s));
@@ -134,13 +136,13 @@ TEST_F(LabelSheet, CopiesFillConsecutiveCellsAndZeroCopiesWriteNoPage)
 TEST_F(LabelSheet, TheContactTemplateAndAttentionOptionsShapeTheContactLine)
 {
     lines({1, 3, 6});
-    c().cmbLabFormat->setCurrentIndex(1);
-    c().chkDeptNewLine->setChecked(true);
+    options.labFormat = 1;
+    options.deptNewLine = true;
     QStringList labels = cells(sheet());
     EXPECT_EQ(labels[0], u"לידי:משה<br>רכש|אבג בע&quot;מ"_s);
     EXPECT_EQ(labels[1], u"Attn:ABC<br>DEF|Smith &amp; &lt;Sons&gt;"_s);
 
-    c().chkShowAttn->setChecked(false);
+    options.showAttn = false;
     lines({3});
     labels = cells(sheet());
     EXPECT_EQ(labels[0], u"משה"_s) << "without line 6 no department; without the word no title";
@@ -150,8 +152,8 @@ TEST_F(LabelSheet, TheContactTemplateAndAttentionOptionsShapeTheContactLine)
 TEST_F(LabelSheet, AContactAddressLongerThanFiveCharactersReplacesTheCardAddress)
 {
     lines({4, 5, 7});
-    c().ChkAllContact->setChecked(true);
-    c().chkUseCntctAddrss->setChecked(true);
+    options.allContacts = true;
+    options.useContactAddress = true;
     const QStringList labels = cells(sheet());
     EXPECT_EQ(labels[0], u"רחוב הגפן 5<br>עכו"_s);
     EXPECT_EQ(labels[1], u"12 Main St|Springfield&nbsp;&nbsp;&nbsp;&nbsp;999"_s) << "\"PO 5\" is too short to be used";
@@ -168,7 +170,7 @@ TEST_F(LabelSheet, FixedTextsAndTheNameAreCutToThirtyCharacters)
 TEST_F(LabelSheet, TheSelectionFilterLeavesOtherCardsOutOfCountAndSheet)
 {
     lines({2});
-    c().ChkSelectAccount->setChecked(true);
+    options.selectAccount = true;
     state.WantedCrd = {u"C4"_s, u"C2"_s};
     EXPECT_EQ(cells(sheet()), (QStringList{u"Code: C2"_s, u"Code: C4"_s, u"-"_s, u"-"_s, u"-"_s, u"-"_s}));
     state.WantedCrd = {u"nobody"_s};
@@ -177,24 +179,25 @@ TEST_F(LabelSheet, TheSelectionFilterLeavesOtherCardsOutOfCountAndSheet)
 
 TEST_F(LabelSheet, AnEmptyResultLeavesTheHeadOnly)
 {
-    c().ChkAccKey->setChecked(true);
-    c().TxtFromCrd->setText(u"X"_s);
-    c().TxtToCrd->setText(u"X"_s);
+    options.codeRange = true;
+    options.fromCard = u"X"_s;
+    options.toCard = u"X"_s;
     EXPECT_TRUE(sheet().endsWith(u"<BODY BGCOLOR='#FFFFFF'>\r\n"_s));
 }
 
 TEST_F(LabelSheet, AFailingStatementLeavesTheSheetAsFarAsItWasWritten)
 {
-    c().ChkUseSQLW->setChecked(true);
-    c().txtSQLWhere->setText(u"NoSuchColumn = 1"_s);
+    options.sqlWhere = true;
+    options.sqlWhereText = u"NoSuchColumn = 1"_s;
     const QString path = tempPath(u"sheet.htm"_s);
-    EXPECT_THROW(card->CreateLabFile(path), Failure);
+    RunContext run = context();
+    EXPECT_THROW(CreateLabFile(path, run), Failure);
     EXPECT_TRUE(fromWindows1255(readFile(path)).endsWith(u"<BODY BGCOLOR='#FFFFFF'>\r\n"_s));
 }
 
 TEST_F(LabelSheet, TheRunOpensTheSheetAndLogsTheCountingQuery)
 {
-    card->RunLabels();
+    run(u"labels"_s);
     ASSERT_EQ(browser.opened, QStringList{tempPath(u"pelmar1.htm"_s)});
     const QString log = fromWindows1255(readFile(tempPath(u"pelmar.log"_s)));
     EXPECT_TRUE(log.contains(u"הפקת מדבקות<br>\r\nSELECT DISTINCT OCRD.CardCode"_s)) << log.toStdString();
@@ -205,19 +208,17 @@ TEST_F(LabelSheet, ABadLayoutFailsBeforeTheFileIsTouchedAndOpensNothing)
 {
     const QString path = tempPath(u"pelmar1.htm"_s);
     writeFile(path, "previous sheet");
-    for (const auto& [box, text] : {std::pair{c().txtRows, u"0"_s}, std::pair{c().txtCopies, u"abc"_s},
-                                    std::pair{c().txtCols, u"40000"_s}}) {
-        const QString kept = box->text();
-        box->setText(text);
-        messages.answers = {true};
-        c().cmbOutType->setCurrentIndex(0);
-        card->CmdLabPrev_Click();
-        box->setText(kept);
-        ASSERT_EQ(messages.boxes.size(), 2);
-        EXPECT_EQ(messages.boxes[1].kind, u"critical"_s);
-        EXPECT_EQ(messages.boxes[1].title, u"תקלה"_s);
-        EXPECT_TRUE(messages.boxes[1].text.contains(text)) << messages.boxes[1];
-        messages.boxes.clear();
+    for (const auto& [box, text] : {std::pair{&MailingOptions::rows, u"0"_s}, std::pair{&MailingOptions::copies, u"abc"_s},
+                                    std::pair{&MailingOptions::cols, u"40000"_s}}) {
+        const QString kept = options.*box;
+        options.*box = text;
+        try {
+            run(u"labels"_s);
+            ADD_FAILURE() << text.toStdString();
+        } catch (const Failure& failure) {
+            EXPECT_TRUE(failure.description().contains(text)) << failure.description().toStdString();
+        }
+        options.*box = kept;
     }
     EXPECT_TRUE(browser.opened.isEmpty());
     EXPECT_EQ(readFile(path), "previous sheet");

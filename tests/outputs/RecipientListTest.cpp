@@ -1,6 +1,8 @@
 #include "common/Windows1255.h"
-#include "outputs/LabelFixture.h"
+#include "support/LabelCompany.h"
+#include "common/Failure.h"
 #include "outputs/RecipientList.h"
+#include "outputs/Runs.h"
 
 #include <QRegularExpression>
 
@@ -14,7 +16,8 @@ protected:
     QString list(short kind)
     {
         const QString path = tempPath(u"list.htm"_s);
-        EXPECT_TRUE(card->CreateHTML(path, kind));
+        RunContext run = context();
+        CreateHTML(path, kind, run);
         return fromWindows1255(readFile(path));
     }
 
@@ -93,32 +96,30 @@ TEST_F(RecipientListTest, EachKindShowsItsOwnColumnsWithContactValuesBeforeCardV
 
 TEST_F(RecipientListTest, TheSelectionFilterAndAnEmptyResult)
 {
-    c().ChkSelectAccount->setChecked(true);
+    options.selectAccount = true;
     state.WantedCrd = {u"C5"_s, u"C1"_s};
     const QString filtered = list(2);
     EXPECT_EQ(rows(filtered).size(), 2);
     EXPECT_TRUE(filtered.contains(u"מספר הכרטיסים ברשימה: 2</p>"_s));
 
-    c().ChkAccKey->setChecked(true);
-    c().TxtFromCrd->setText(u"Z"_s);
-    c().TxtToCrd->setText(u"Z"_s);
+    options.codeRange = true;
+    options.fromCard = u"Z"_s;
+    options.toCard = u"Z"_s;
     EXPECT_TRUE(list(3).endsWith(u"  </tr>\r\n  <tr><td colspan='5'><hr noshade size='2'></td></tr>\r\n"_s));
 }
 
 TEST_F(RecipientListTest, ThePreviewWritesTheListOfTheChosenOutputAndLogsIt)
 {
-    c().cmbOutType->setCurrentIndex(2);
-    card->CmdPreview_Click();
+    options.outType = 2;
+    run(u"list"_s);
     ASSERT_EQ(browser.opened, QStringList{tempPath(u"pelmar2.htm"_s)});
     EXPECT_TRUE(fromWindows1255(readFile(browser.opened[0])).contains(u"דיוור ישיר בדואר אלקטרוני"_s));
     EXPECT_TRUE(fromWindows1255(readFile(tempPath(u"pelmar.log"_s))).contains(u"רשימת מעקב<br>"_s));
 
-    c().cmbOutType->setCurrentIndex(-1);
-    c().txtRows->setText(u"0"_s);
-    card->CmdPreview_Click();
+    options.outType = -1;
+    options.rows = u"0"_s;
+    EXPECT_THROW(run(u"list"_s), Failure);
     EXPECT_EQ(browser.opened.size(), 1) << "a list that cannot be written opens no window";
-    ASSERT_EQ(messages.boxes.size(), 1);
-    EXPECT_EQ(messages.boxes[0].title, u"תקלה"_s);
 }
 
 TEST(LabelPages, PagesNeededForTheRecipientsAndCopies)

@@ -1,4 +1,6 @@
-#include "outputs/LabelFixture.h"
+#include "common/Failure.h"
+#include "outputs/Runs.h"
+#include "support/LabelCompany.h"
 
 using namespace Qt::StringLiterals;
 
@@ -10,7 +12,8 @@ protected:
     QByteArray numbers()
     {
         const QString path = tempPath(u"sms.txt"_s);
-        EXPECT_TRUE(card->CreateSMSFile(path));
+        RunContext run = context();
+        CreateSMSFile(path, run);
         return readFile(path);
     }
 };
@@ -18,19 +21,19 @@ protected:
 TEST_F(SmsListTest, ContactMobileFirstNumbersAsStoredAndRecipientsWithoutOneLeftOut)
 {
     EXPECT_EQ(numbers(), QByteArray("052-999\r\n050-222\r\n054 777\r\n"));
-    c().ChkSelectAccount->setChecked(true);
+    options.selectAccount = true;
     state.WantedCrd = {u"C5"_s};
     EXPECT_EQ(numbers(), QByteArray("054 777\r\n"));
 }
 
 TEST_F(SmsListTest, TheCardMobileStandsWhenTheContactsIsEmptyAndNoRowsLeaveAnEmptyFile)
 {
-    c().ChkAccKey->setChecked(true);
-    c().TxtFromCrd->setText(u"C2"_s);
-    c().TxtToCrd->setText(u"C2"_s);
+    options.codeRange = true;
+    options.fromCard = u"C2"_s;
+    options.toCard = u"C2"_s;
     EXPECT_EQ(numbers(), QByteArray("050-222\r\n"));
-    c().TxtFromCrd->setText(u"Z"_s);
-    c().TxtToCrd->setText(u"Z"_s);
+    options.fromCard = u"Z"_s;
+    options.toCard = u"Z"_s;
     EXPECT_EQ(numbers(), QByteArray());
 }
 
@@ -39,24 +42,20 @@ TEST_F(SmsListTest, TheRunAsksForTheFileReplacesItAndSaysTheListIsReady)
     const QString path = tempPath(u"mine.txt"_s);
     writeFile(path, "old content that is longer than the list\r\n");
     files.answers = {path};
-    c().cmbOutType->setCurrentIndex(3);
-    card->CmdLabPrev_Click();
+    run(u"sms"_s);
     ASSERT_EQ(files.calls.size(), 1);
     EXPECT_EQ(files.calls[0].filter, u"Text Files (*.txt)|*.txt|All Files (*.*)|*.*"_s);
     EXPECT_EQ(files.calls[0].filterIndex, 1);
     EXPECT_EQ(files.calls[0].defaultName, u"smslist"_s);
     EXPECT_EQ(readFile(path), QByteArray("052-999\r\n050-222\r\n054 777\r\n"));
-    ASSERT_EQ(messages.boxes.size(), 2);
-    EXPECT_EQ(messages.boxes[1], (FakeMessages::Box{u"information"_s, u"הודעה"_s, u"קובץ רשימת הטלפונים הניידים מוכן"_s}));
+    ASSERT_EQ(messages.boxes.size(), 1);
+    EXPECT_EQ(messages.boxes[0], (FakeMessages::Box{u"information"_s, u"הודעה"_s, u"קובץ רשימת הטלפונים הניידים מוכן"_s}));
 }
 
 TEST_F(SmsListTest, ACancelledDialogIsReportedAndWritesNothing)
 {
-    c().cmbOutType->setCurrentIndex(3);
-    card->CmdLabPrev_Click();
-    ASSERT_EQ(messages.boxes.size(), 2);
-    EXPECT_EQ(messages.boxes[1].kind, u"critical"_s);
-    EXPECT_EQ(messages.boxes[1].title, u"תקלה"_s);
+    EXPECT_THROW(run(u"sms"_s), Failure);
+    EXPECT_TRUE(messages.boxes.isEmpty());
 }
 
 TEST_F(SmsListTest, AnUnreadableCompanyWritesNothingAndSaysNothingIsReady)
@@ -65,11 +64,9 @@ TEST_F(SmsListTest, AnUnreadableCompanyWritesNothingAndSaysNothingIsReady)
     const QString path = tempPath(u"mine.txt"_s);
     writeFile(path, "kept");
     files.answers = {path};
-    c().cmbOutType->setCurrentIndex(3);
-    card->CmdLabPrev_Click();
+    EXPECT_THROW(run(u"sms"_s), Failure);
     EXPECT_EQ(readFile(path), QByteArray("kept"));
-    ASSERT_EQ(messages.boxes.size(), 2);
-    EXPECT_EQ(messages.boxes[1].kind, u"critical"_s) << "the schema level's own message, and no 'ready'";
+    EXPECT_TRUE(messages.boxes.isEmpty()) << "no 'ready'";
 }
 
 }  // namespace

@@ -1,6 +1,6 @@
 #include "common/Failure.h"
 #include "common/SessionState.h"
-#include "selection/Criteria.h"
+#include "options/MailingOptions.h"
 #include "selection/DateText.h"
 #include "selection/DocTypes.h"
 #include "selection/SelectBuilder.h"
@@ -18,7 +18,7 @@ namespace {
 TEST(StatementText, TheDocumentedExamplesComeOutByteForByte)
 {
     SessionState state;
-    Criteria groups;
+    MailingOptions groups;
     groups.catCode = true;
     groups.cardType = 0;
     state.SelCardGroups = {CardGroupSel{}, CardGroupSel{100, true}, CardGroupSel{101, false}, CardGroupSel{103, true}};
@@ -31,9 +31,8 @@ TEST(StatementText, TheDocumentedExamplesComeOutByteForByte)
     state.QryGroupRelation = u"OR"_s;
     EXPECT_EQ(BuildQryGroupCriteria(state), u" And (OCRD.QryGroup3='Y' OR OCRD.QryGroup17='Y')"_s);
 
-    Criteria labels;
+    MailingOptions labels;
     labels.addressFrom = 0;
-    labels.deptTag = u"0"_s;
     EXPECT_EQ(BuildSelect(labels, 0, 0, true, kLabels),
               u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.MailAddres, OCRD.MailCounty, OCRD.MailCity, "
               "OCRD.MailZipCod, OCPR.Name Attn, OCPR.Notes1 Department, OCPR.Address CntctAddrs, '' MailBlock, "
@@ -46,59 +45,59 @@ TEST(StatementText, TheDocumentedExamplesComeOutByteForByte)
 
 struct WhereCase {
     const char* name;
-    std::function<void(Criteria&, SessionState&)> set;
+    std::function<void(MailingOptions&, SessionState&)> set;
     QString expected;
 };
 
 TEST(StatementText, EachCriterionAddsItsFragmentInOrder)
 {
     const WhereCase cases[] = {
-        {"nothing on", [](Criteria&, SessionState&) {}, u" Where (1 > 0)"_s},
-        {"type without groups", [](Criteria& c, SessionState&) { c.catCode = true; c.cardType = 1; },
+        {"nothing on", [](MailingOptions&, SessionState&) {}, u" Where (1 > 0)"_s},
+        {"type without groups", [](MailingOptions& c, SessionState&) { c.catCode = true; c.cardType = 1; },
          u" Where (1 > 0) AND OCRD.CardType = 'S'"_s},
-        {"no type chosen", [](Criteria& c, SessionState&) { c.catCode = true; c.cardType = -1; },
+        {"no type chosen", [](MailingOptions& c, SessionState&) { c.catCode = true; c.cardType = -1; },
          u" Where (1 > 0) AND OCRD.CardType = 'All'"_s},
-        {"leads", [](Criteria& c, SessionState&) { c.catCode = true; c.cardType = 2; },
+        {"leads", [](MailingOptions& c, SessionState&) { c.catCode = true; c.cardType = 2; },
          u" Where (1 > 0) AND OCRD.CardType = 'L'"_s},
-        {"code range with apostrophes", [](Criteria& c, SessionState&) { c.codeRange = true; c.fromCard = u"C'01"_s; c.toCard = u"C'09"_s; },
+        {"code range with apostrophes", [](MailingOptions& c, SessionState&) { c.codeRange = true; c.fromCard = u"C'01"_s; c.toCard = u"C'09"_s; },
          u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'C''01' And N'C''09'"_s},
-        {"empty code range", [](Criteria& c, SessionState&) { c.codeRange = true; },
+        {"empty code range", [](MailingOptions& c, SessionState&) { c.codeRange = true; },
          u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'' And N''"_s},
-        {"city of the mailing address", [](Criteria& c, SessionState&) { c.city = true; c.cityPrefix = u"קריית"_s; c.addressFrom = 0; },
+        {"city of the mailing address", [](MailingOptions& c, SessionState&) { c.city = true; c.cityPrefix = u"קריית"_s; c.addressFrom = 0; },
          u" Where (1 > 0) AND OCRD.MailCity LIKE N'קריית%'"_s},
-        {"city of the card address", [](Criteria& c, SessionState&) { c.city = true; c.cityPrefix = u"ב'"_s; c.addressFrom = 1; },
+        {"city of the card address", [](MailingOptions& c, SessionState&) { c.city = true; c.cityPrefix = u"ב'"_s; c.addressFrom = 1; },
          u" Where (1 > 0) AND OCRD.City LIKE N'ב''%'"_s},
-        {"phone 2", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = 1; c.phonePrefix = u"03"_s; },
+        {"phone 2", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 1; c.phonePrefix = u"03"_s; },
          u" Where (1 > 0) AND OCRD.Phone2 LIKE N'03%'"_s},
-        {"mobile", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = 2; c.phonePrefix = u"05"_s; },
+        {"mobile", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 2; c.phonePrefix = u"05"_s; },
          u" Where (1 > 0) AND OCRD.Cellular LIKE N'05%'"_s},
-        {"fax", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = 3; c.phonePrefix = u"04"_s; },
+        {"fax", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 3; c.phonePrefix = u"04"_s; },
          u" Where (1 > 0) AND OCRD.Fax LIKE N'04%'"_s},
-        {"contact mobile", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = 4; c.phonePrefix = u"052"_s; },
+        {"contact mobile", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 4; c.phonePrefix = u"052"_s; },
          u" Where (1 > 0) AND OCPR.Cellolar LIKE N'052%'"_s},
-        {"no phone type", [](Criteria& c, SessionState&) { c.phone = true; c.phoneType = -1; },
+        {"no phone type", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = -1; },
          u" Where (1 > 0) AND OCRD.Phone1 LIKE N'%'"_s},
-        {"sales employee", [](Criteria& c, SessionState&) { c.agent = true; c.agentCode = -1; },
+        {"sales employee", [](MailingOptions& c, SessionState&) { c.agent = true; c.agents = {{u"ללא"_s, -1}}; c.agentIndex = 0; },
          u" Where (1 > 0) AND OCRD.SlpCode = -1"_s},
-        {"documents present", [](Criteria& c, SessionState&) { c.dates = true; c.fromDate = u"31/12/99"_s; c.toDate = u"1/1/00"_s; c.docType = 2; c.toDocNum = u"77"_s; },
+        {"documents present", [](MailingOptions& c, SessionState&) { c.dates = true; c.fromDate = u"31/12/99"_s; c.toDate = u"1/1/00"_s; c.docType = 2; c.toDocNum = u"77"_s; },
          u" Where (1 > 0) AND ODLN.DocDate Between '12/31/1999' And '01/01/2000' And ODLN.DocNum<=77"_s},
-        {"checks absent", [](Criteria& c, SessionState&) { c.dates = true; c.fromDate = u"15/6/2004"_s; c.toDate = u"5/3/05"_s; c.docType = 6; c.byDoc = 1; },
+        {"checks absent", [](MailingOptions& c, SessionState&) { c.dates = true; c.fromDate = u"15/6/2004"_s; c.toDate = u"5/3/05"_s; c.docType = 6; c.byDoc = 1; },
          u" Where (1 > 0) AND OCRD.CardCode Not In (Select Distinct VendorCode From OCHO Where OCHO.PmntDate Between '06/15/2004' And '03/05/2005')"_s},
-        {"documents with no relation", [](Criteria& c, SessionState&) { c.dates = true; c.fromDate = c.toDate = u"1/1/05"_s; c.byDoc = -1; },
+        {"documents with no relation", [](MailingOptions& c, SessionState&) { c.dates = true; c.fromDate = c.toDate = u"1/1/05"_s; c.byDoc = -1; },
          u" Where (1 > 0)"_s},
-        {"items", [](Criteria& c, SessionState&) { c.items = true; c.fromItem = u"A'1"_s; c.toItem = u"B"_s; },
+        {"items", [](MailingOptions& c, SessionState&) { c.items = true; c.fromItem = u"A'1"_s; c.toItem = u"B"_s; },
          u" Where (1 > 0) AND (OCRD.CardCode IN (SELECT CardCode FROM OINV, INV1 Where INV1.DocEntry = OINV.DocEntry And INV1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode) OR OCRD.CardCode IN (SELECT CardCode FROM ORIN, RIN1 Where RIN1.DocEntry = ORIN.DocEntry And RIN1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode))"_s},
-        {"properties none chosen", [](Criteria& c, SessionState&) { c.properties = true; },
+        {"properties none chosen", [](MailingOptions& c, SessionState&) { c.properties = true; },
          u" Where (1 > 0) And (1>0)"_s},
-        {"properties default AND", [](Criteria& c, SessionState& s) { c.properties = true; s.QryGroupSel[1] = s.QryGroupSel[64] = true; },
+        {"properties default AND", [](MailingOptions& c, SessionState& s) { c.properties = true; s.QryGroupSel[1] = s.QryGroupSel[64] = true; },
          u" Where (1 > 0) And (OCRD.QryGroup1='Y' AND OCRD.QryGroup64='Y')"_s},
-        {"free SQL empty", [](Criteria& c, SessionState&) { c.sqlWhere = true; },
+        {"free SQL empty", [](MailingOptions& c, SessionState&) { c.sqlWhere = true; },
          u" Where (1 > 0)"_s},
-        {"free SQL as typed", [](Criteria& c, SessionState&) { c.sqlWhere = true; c.sqlWhereText = u"OCRD.Notes LIKE 'x%'"_s; },
+        {"free SQL as typed", [](MailingOptions& c, SessionState&) { c.sqlWhere = true; c.sqlWhereText = u"OCRD.Notes LIKE 'x%'"_s; },
          u" Where (1 > 0) And OCRD.Notes LIKE 'x%'"_s},
     };
     for (const WhereCase& c : cases) {
-        Criteria criteria;
+        MailingOptions criteria;
         SessionState state;
         c.set(criteria, state);
         EXPECT_EQ(BuildWhere(criteria, state), c.expected) << c.name;
@@ -107,15 +106,15 @@ TEST(StatementText, EachCriterionAddsItsFragmentInOrder)
 
 TEST(StatementText, ACriterionThatCannotBeReadIsNamedInsteadOfBreakingTheStatement)
 {
-    const std::pair<std::function<void(Criteria&)>, QString> cases[] = {
-        {[](Criteria& c) { c.agent = true; }, u"סוכן"_s},
-        {[](Criteria& c) { c.dates = true; c.fromDate = u"yesterday"_s; c.toDate = u"1/1/05"_s; }, u"yesterday"_s},
-        {[](Criteria& c) { c.dates = true; c.fromDate = u"1/1/05"_s; c.toDate = u"1/1/05"_s; c.fromDocNum = u"1; DROP TABLE OCRD"_s; },
+    const std::pair<std::function<void(MailingOptions&)>, QString> cases[] = {
+        {[](MailingOptions& c) { c.agent = true; }, u"סוכן"_s},
+        {[](MailingOptions& c) { c.dates = true; c.fromDate = u"yesterday"_s; c.toDate = u"1/1/05"_s; }, u"yesterday"_s},
+        {[](MailingOptions& c) { c.dates = true; c.fromDate = u"1/1/05"_s; c.toDate = u"1/1/05"_s; c.fromDocNum = u"1; DROP TABLE OCRD"_s; },
          u"1; DROP TABLE OCRD"_s},
-        {[](Criteria& c) { c.dates = true; c.fromDate = u"1/1/05"_s; c.toDate = u"1/1/05"_s; c.toDocNum = u"12.5"_s; }, u"12.5"_s},
+        {[](MailingOptions& c) { c.dates = true; c.fromDate = u"1/1/05"_s; c.toDate = u"1/1/05"_s; c.toDocNum = u"12.5"_s; }, u"12.5"_s},
     };
     for (const auto& [set, named] : cases) {
-        Criteria criteria;
+        MailingOptions criteria;
         set(criteria);
         try {
             BuildWhere(criteria, SessionState{});
@@ -141,7 +140,7 @@ TEST(StatementText, DatesAreReadDayFirstWithTwoDigitYearsAndRollOver)
 
 TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
 {
-    Criteria c;
+    MailingOptions c;
     EXPECT_EQ(BuildSelect(c, 1, 0, false, kCardList),
               u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
     c.allContacts = true;
@@ -151,7 +150,7 @@ TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
               u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Address MailAddres, OCRD.County MailCounty, OCRD.City MailCity, OCRD.ZipCode MailZipCod, OCPR.Name Attn, OCPR.Position Department, OCPR.Address As CntctAddrs, OCRD.Block MailBlock, OCST.Name MailState, OCRY.Name MailCountry FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode )"
               " LEFT JOIN OCRY ON (OCRY.Code = OCRD.Country) LEFT JOIN OCST ON (OCST.Code = OCRD.State1 AND OCST.Country = OCRD.Country)"_s);
 
-    Criteria checks;
+    MailingOptions checks;
     checks.dates = true;
     checks.fromDate = checks.toDate = u"1/1/05"_s;
     checks.docType = 6;
@@ -163,17 +162,18 @@ TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
     EXPECT_EQ(BuildOrderBy(checks, -1, 6, kLabels), u" ORDER BY OCHO.VendorName ASC"_s)
         << "the name key is the column the list takes the name from";
 
-    Criteria fax;
-    fax.mergeExpressions = {{u"OCRD.Phone2"_s, u"Field4"_s}};
+    MailingOptions fax;
+    fax.faxField[4] = true;
+    fax.faxExpr[4] = u"OCRD.Phone2"_s;
     EXPECT_EQ(BuildSelect(fax, 1, 0, false, kFax),
               u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Fax, OCRD.Phone1, OCPR.Name AS Attn, OCPR.Name AS CName, OCPR.Fax AS CFax, OCPR.Position, OCPR.Notes1, OCPR.Notes2, OCRD.Phone2 As Field4 FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
     EXPECT_FALSE(BuildSelect(fax, 1, 0, false, kEmail).contains(u"Field4"_s));
-    EXPECT_TRUE(BuildSelect(Criteria{}, 1, 0, false, 7).startsWith(u" FROM OCRD"_s));
+    EXPECT_TRUE(BuildSelect(MailingOptions{}, 1, 0, false, 7).startsWith(u" FROM OCRD"_s));
 }
 
 TEST(StatementText, ASortKeyOutsideTheListIsSelectedSoTheDatabaseAcceptsTheOrder)
 {
-    Criteria c;
+    MailingOptions c;
     c.sortBy = 2;
     c.addressFrom = 0;
     EXPECT_TRUE(BuildSelect(c, 1, 0, false, kCardList).contains(u", OCRD.MailCity AS SortKey1 FROM"_s));
@@ -190,7 +190,7 @@ TEST(StatementText, ASortKeyOutsideTheListIsSelectedSoTheDatabaseAcceptsTheOrder
 
 TEST(StatementText, TheCardListNeverGainsAContactColumnAndUserExpressionsHideNoKey)
 {
-    Criteria c;
+    MailingOptions c;
     c.allContacts = true;
     c.sortBy = 4;
     EXPECT_TRUE(BuildSelect(c, 1, 0, false, kCardList).contains(u", OCRD.MailZipCod AS SortKey1 FROM"_s));
@@ -199,9 +199,10 @@ TEST(StatementText, TheCardListNeverGainsAContactColumnAndUserExpressionsHideNoK
     EXPECT_EQ(BuildOrderBy(c, 1, 0, kCardList), u" ORDER BY SortKey1 ASC"_s);
     EXPECT_FALSE(BuildSelect(c, 1, 0, false, kCardList).contains(u"OCPR.Cellolar"_s)) << "one row per card";
 
-    Criteria merged;
+    MailingOptions merged;
     merged.sortBy = 5;
-    merged.mergeExpressions = {{u"'+' + OCRD.Cellular"_s, u"Field4"_s}};
+    merged.faxField[4] = true;
+    merged.faxExpr[4] = u"'+' + OCRD.Cellular"_s;
     EXPECT_TRUE(BuildSelect(merged, 1, 0, false, kFax).contains(u"OCRD.Cellular AS SortKey2"_s));
 }
 

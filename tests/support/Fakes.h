@@ -3,6 +3,7 @@
 #include "common/BrowserWindow.h"
 #include "common/FileDialogs.h"
 #include "common/Messages.h"
+#include "common/Progress.h"
 
 #include <QList>
 #include <QString>
@@ -59,6 +60,19 @@ public:
 
 private:
     QString nextAnswer();
+};
+
+// Records every report of a run's progress.
+class FakeProgress : public ProgressSink {
+public:
+    struct Report {
+        QString text;
+        double fraction;
+    };
+
+    void report(const QString& text, double fraction) override { reports.append({text, fraction}); }
+
+    QList<Report> reports;
 };
 
 }  // namespace pelmar::test

@@ -16,6 +16,7 @@ protected:
     void SetUp() override;
     void TearDown() override;
 
+    QString folder() const { return dir_.path(); }
     QString path(const QString& name) const { return dir_.filePath(name); }
     QString configFolder() const { return path(QStringLiteral("config/Pelmar")); }
     QString tempPath(const QString& name) const { return path(QStringLiteral("temp/") + name); }

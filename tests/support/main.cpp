@@ -1,22 +1,11 @@
-#include <QApplication>
-#include <QDir>
-#include <QFile>
+#include <QCoreApplication>
 
 #include <gtest/gtest.h>
 
-// Every test program runs with a real QApplication on the offscreen platform, so widgets can be
-// built and driven without a display.
+// A core test program: Qt without a window or a GUI platform, as the command line runs.
 int main(int argc, char* argv[])
 {
-    qputenv("QT_QPA_PLATFORM", "offscreen");
-    if (qEnvironmentVariableIsEmpty("XDG_RUNTIME_DIR")) {
-        const QByteArray folder = QDir::tempPath().toLocal8Bit() + "/runtime-pelmar-tests";
-        QDir().mkpath(QString::fromLocal8Bit(folder));
-        QFile::setPermissions(QString::fromLocal8Bit(folder), QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner);
-        qputenv("XDG_RUNTIME_DIR", folder);
-    }
-    QApplication app(argc, argv);
-    QApplication::setLayoutDirection(Qt::RightToLeft);
+    QCoreApplication app(argc, argv);
     ::testing::InitGoogleTest(&argc, argv);
     return RUN_ALL_TESTS();
 }

@@ -1,6 +1,7 @@
 #include "control/MainCardControls.h"
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
+#include "options/Lists.h"
 
 #include <QComboBox>
 #include <QFrame>
@@ -37,8 +38,7 @@ QWidget* buildCommandStrip(MainCardControls& c)
 {
     auto* strip = new QWidget;
     auto* grid = new QGridLayout(strip);
-    c.cmbOutType = listBox(u"cmbOutType"_s, {u"מדבקות למעטפות"_s, u"מכתבים בפקס"_s, u"דואר אלקטרוני"_s,
-                                             u"לטלפונים סלולריים"_s, u"הדפסת מכתבים"_s});
+    auto* cmbOutType = listBox(u"cmbOutType"_s, outputTypeEntries());
     c.CmdLabPrev = button(u"CmdLabPrev"_s, u"הפעל דיוור"_s);
     c.CmdPreview = button(u"CmdPreview"_s, u"הצג רשימת מעקב"_s);
     c.CmdDef = button(u"CmdDef"_s, u"שמור הגדרות"_s);
@@ -47,7 +47,7 @@ QWidget* buildCommandStrip(MainCardControls& c)
 
     auto* buttons = new QHBoxLayout;
     buttons->addWidget(caption(u"סוג הדיוור:"_s));
-    buttons->addWidget(c.cmbOutType);
+    buttons->addWidget(cmbOutType);
     buttons->addWidget(c.CmdLabPrev);
     buttons->addWidget(c.CmdPreview);
     buttons->addWidget(c.CmdDef);

@@ -1,6 +1,7 @@
 #include "control/MainCardControls.h"
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
+#include "options/Lists.h"
 
 #include <QCheckBox>
 #include <QComboBox>
@@ -36,72 +37,69 @@ void addRange(QGridLayout* grid, int row, QLineEdit* from, QLineEdit* to)
 void buildCardRows(QGridLayout* grid, MainCardControls& c)
 {
     c.ChkCatCode = checkBox(u"ChkCatCode"_s);
-    c.LblCatCode = caption(u"השתייכות:"_s, u"LblCatCode"_s);
-    c.cmbCS = listBox(u"cmbCS"_s, {u"לקוחות"_s, u"ספקים"_s, u"לידים"_s});
+    auto* LblCatCode = caption(u"השתייכות:"_s, u"LblCatCode"_s);
+    c.cmbCS = listBox(u"cmbCS"_s, cardTypeEntries());
     c.CmdSelectGroup = button(u"CmdSelectGroup"_s, u"בחירת קבוצות השתייכות..."_s);
     grid->addWidget(c.ChkCatCode, 0, kSwitch);
-    grid->addWidget(c.LblCatCode, 0, kCaption);
+    grid->addWidget(LblCatCode, 0, kCaption);
     grid->addWidget(c.cmbCS, 0, kFirst);
     grid->addWidget(c.CmdSelectGroup, 0, kButton);
 
-    c.ChkAccKey = checkBox(u"ChkAccKey"_s);
-    c.TxtFromCrd = leftToRight(textBox(u"TxtFromCrd"_s));
-    c.TxtToCrd = leftToRight(textBox(u"TxtToCrd"_s));
-    grid->addWidget(c.ChkAccKey, 1, kSwitch);
+    auto* ChkAccKey = checkBox(u"ChkAccKey"_s);
+    auto* TxtFromCrd = leftToRight(textBox(u"TxtFromCrd"_s));
+    auto* TxtToCrd = leftToRight(textBox(u"TxtToCrd"_s));
+    grid->addWidget(ChkAccKey, 1, kSwitch);
     grid->addWidget(caption(u"מכרטיס:"_s), 1, kCaption);
-    addRange(grid, 1, c.TxtFromCrd, c.TxtToCrd);
+    addRange(grid, 1, TxtFromCrd, TxtToCrd);
 
-    c.ChkCity = checkBox(u"ChkCity"_s);
-    c.TxtCity = textBox(u"TxtCity"_s);
-    grid->addWidget(c.ChkCity, 2, kSwitch);
+    auto* ChkCity = checkBox(u"ChkCity"_s);
+    auto* TxtCity = textBox(u"TxtCity"_s);
+    grid->addWidget(ChkCity, 2, kSwitch);
     grid->addWidget(caption(u"כל הערים ששמן מתחיל ב:"_s), 2, kCaption);
-    grid->addWidget(c.TxtCity, 2, kFirst);
+    grid->addWidget(TxtCity, 2, kFirst);
 
-    c.ChkPhone = checkBox(u"ChkPhone"_s);
-    c.cmbPhoneType = listBox(u"cmbPhoneType"_s, {u"טלפון 1"_s, u"טלפון 2"_s, u"טלפון נייד"_s, u"פקס"_s,
-                                                 u"טלפון נייד - איש קשר"_s});
-    c.txtPhone = leftToRight(textBox(u"txtPhone"_s));
-    grid->addWidget(c.ChkPhone, 3, kSwitch);
-    grid->addWidget(c.cmbPhoneType, 3, kCaption);
+    auto* ChkPhone = checkBox(u"ChkPhone"_s);
+    auto* cmbPhoneType = listBox(u"cmbPhoneType"_s, phoneTypeEntries());
+    auto* txtPhone = leftToRight(textBox(u"txtPhone"_s));
+    grid->addWidget(ChkPhone, 3, kSwitch);
+    grid->addWidget(cmbPhoneType, 3, kCaption);
     grid->addWidget(caption(u"כל הטלפונים שמתחילים ב:"_s), 3, kFirst);
-    grid->addWidget(c.txtPhone, 3, kSecond);
+    grid->addWidget(txtPhone, 3, kSecond);
 
-    c.ChkAgent = checkBox(u"ChkAgent"_s);
+    auto* ChkAgent = checkBox(u"ChkAgent"_s);
     c.CmbAgent = listBox(u"CmbAgent"_s, {});
-    grid->addWidget(c.ChkAgent, 4, kSwitch);
+    grid->addWidget(ChkAgent, 4, kSwitch);
     grid->addWidget(caption(u"סוכן:"_s), 4, kCaption);
     grid->addWidget(c.CmbAgent, 4, kFirst);
 }
 
 void buildDocumentRows(QGridLayout* grid, MainCardControls& c)
 {
-    c.ChkDates = checkBox(u"ChkDates"_s);
-    c.TxtFromDate = leftToRight(textBox(u"TxtFromDate"_s));
-    c.TxtToDate = leftToRight(textBox(u"TxtToDate"_s));
-    grid->addWidget(c.ChkDates, 5, kSwitch);
+    auto* ChkDates = checkBox(u"ChkDates"_s);
+    auto* TxtFromDate = leftToRight(textBox(u"TxtFromDate"_s));
+    auto* TxtToDate = leftToRight(textBox(u"TxtToDate"_s));
+    grid->addWidget(ChkDates, 5, kSwitch);
     grid->addWidget(caption(u"מתאריך:"_s), 5, kCaption);
-    addRange(grid, 5, c.TxtFromDate, c.TxtToDate);
+    addRange(grid, 5, TxtFromDate, TxtToDate);
 
-    c.CmbDocType = listBox(u"CmbDocType"_s, {u"חשבוניות מס"_s, u"חש. מס זיכוי"_s, u"תעודות משלוח"_s,
-                                             u"הזמנות רכש"_s, u"הצעות מחיר"_s, u"קבלות"_s, u"שיקים"_s,
-                                             u"תש. לספקים"_s, u"תשלומי אשראי"_s});
-    c.cmbByDoc = listBox(u"cmbByDoc"_s, {u"הופקו"_s, u"לא הופקו"_s});
+    auto* CmbDocType = listBox(u"CmbDocType"_s, documentTypeEntries());
+    auto* cmbByDoc = listBox(u"cmbByDoc"_s, byDocumentEntries());
     grid->addWidget(caption(u"על פי:"_s), 6, kCaption);
-    grid->addWidget(c.CmbDocType, 6, kFirst);
+    grid->addWidget(CmbDocType, 6, kFirst);
     grid->addWidget(caption(u"כרטיסים:"_s), 6, kTo);
-    grid->addWidget(c.cmbByDoc, 6, kSecond);
+    grid->addWidget(cmbByDoc, 6, kSecond);
 
-    c.txtFromDocNum = leftToRight(textBox(u"txtFromDocNum"_s));
-    c.txtToDocNum = leftToRight(textBox(u"txtToDocNum"_s));
+    auto* txtFromDocNum = leftToRight(textBox(u"txtFromDocNum"_s));
+    auto* txtToDocNum = leftToRight(textBox(u"txtToDocNum"_s));
     grid->addWidget(caption(u"ממס' מסמך:"_s), 7, kCaption);
-    addRange(grid, 7, c.txtFromDocNum, c.txtToDocNum);
+    addRange(grid, 7, txtFromDocNum, txtToDocNum);
 
     c.ChkItems = checkBox(u"ChkItems"_s, u"ע\"פ פריטים שנמכרו:"_s);
-    c.txtFromItem = leftToRight(textBox(u"txtFromItem"_s));
-    c.txtToItem = leftToRight(textBox(u"txtToItem"_s));
+    auto* txtFromItem = leftToRight(textBox(u"txtFromItem"_s));
+    auto* txtToItem = leftToRight(textBox(u"txtToItem"_s));
     grid->addWidget(c.ChkItems, 8, kSwitch);
     grid->addWidget(caption(u"מפריט:"_s), 8, kCaption);
-    addRange(grid, 8, c.txtFromItem, c.txtToItem);
+    addRange(grid, 8, txtFromItem, txtToItem);
 }
 
 void buildOtherRows(QGridLayout* grid, MainCardControls& c)
@@ -112,11 +110,11 @@ void buildOtherRows(QGridLayout* grid, MainCardControls& c)
     grid->addWidget(caption(u"מאפיינים:"_s), 9, kCaption);
     grid->addWidget(c.cmdQryGroup, 9, kButton);
 
-    c.ChkUseSQLW = checkBox(u"ChkUseSQLW"_s);
-    c.txtSQLWhere = leftToRight(textBox(u"txtSQLWhere"_s));
-    grid->addWidget(c.ChkUseSQLW, 10, kSwitch);
+    auto* ChkUseSQLW = checkBox(u"ChkUseSQLW"_s);
+    auto* txtSQLWhere = leftToRight(textBox(u"txtSQLWhere"_s));
+    grid->addWidget(ChkUseSQLW, 10, kSwitch);
     grid->addWidget(caption(u"חתך SQL:"_s), 10, kCaption);
-    grid->addWidget(c.txtSQLWhere, 10, kFirst, 1, 3);
+    grid->addWidget(txtSQLWhere, 10, kFirst, 1, 3);
 
     c.ChkSelectAccount = checkBox(u"ChkSelectAccount"_s);
     c.cmdSelectAccount = button(u"cmdSelectAccount"_s, u"בחירת כרטיסים..."_s);
@@ -126,12 +124,11 @@ void buildOtherRows(QGridLayout* grid, MainCardControls& c)
     grid->addWidget(c.cmdSelectAccount, 11, kFirst);
     grid->addWidget(c.cmdSelByFile, 11, kSecond);
 
-    c.CmbSortBy = listBox(u"CmbSortBy"_s, {u"מפתח לקוח"_s, u"שם לקוח"_s, u"עיר"_s, u"מיקוד"_s,
-                                           u"איש קשר ומיקוד"_s, u"טלפון סלולרי"_s});
-    c.CmbSortDir = listBox(u"CmbSortDir"_s, {u"עולה"_s, u"יורד"_s});
+    auto* CmbSortBy = listBox(u"CmbSortBy"_s, sortByEntries());
+    auto* CmbSortDir = listBox(u"CmbSortDir"_s, sortDirectionEntries());
     grid->addWidget(caption(u"מיון לפי:"_s), 12, kCaption);
-    grid->addWidget(c.CmbSortBy, 12, kFirst);
-    grid->addWidget(c.CmbSortDir, 12, kSecond);
+    grid->addWidget(CmbSortBy, 12, kFirst);
+    grid->addWidget(CmbSortDir, 12, kSecond);
 }
 
 }  // namespace

@@ -1,5 +1,5 @@
 #include "control/MainCardControls.h"
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
 
 #include <QButtonGroup>
@@ -37,57 +37,57 @@ QGroupBox* buildMessage(MainCardControls& c)
 {
     QGridLayout* grid = nullptr;
     QGroupBox* group = groupBox(u"ההודעה"_s, grid);
-    c.txtEmailFrom = addressBox(u"txtEmailFrom"_s);
-    c.txtEmailFromDesc = describedBox(u"txtEmailFromDesc"_s, u"תאור השולח"_s);
-    c.txtEmailSubject = textBox(u"txtEmailSubject"_s);
-    c.txtEmailContent = new QPlainTextEdit(u"שלום רב. מצורף מידע על המבצעים החדשים"_s);
-    c.txtEmailContent->setObjectName(u"txtEmailContent"_s);
+    auto* txtEmailFrom = addressBox(u"txtEmailFrom"_s);
+    auto* txtEmailFromDesc = describedBox(u"txtEmailFromDesc"_s, u"תאור השולח"_s);
+    auto* txtEmailSubject = textBox(u"txtEmailSubject"_s);
+    auto* txtEmailContent = new QPlainTextEdit(u"שלום רב. מצורף מידע על המבצעים החדשים"_s);
+    txtEmailContent->setObjectName(u"txtEmailContent"_s);
     c.txtEmailHTMLBody = addressBox(u"txtEmailHTMLBody"_s);
     c.CmdDir[1] = folderButton(1, {});
     c.txtEmailAttachFile = addressBox(u"txtEmailAttachFile"_s);
     c.CmdDir[2] = folderButton(2, {});
-    c.txtEmailAttachFileDesc = describedBox(u"txtEmailAttachFileDesc"_s, u"תאור הקובץ"_s);
+    auto* txtEmailAttachFileDesc = describedBox(u"txtEmailAttachFileDesc"_s, u"תאור הקובץ"_s);
 
     grid->addWidget(caption(u"הודעה מאת:"_s), 0, 0);
-    grid->addWidget(c.txtEmailFrom, 0, 1, 1, 2);
-    grid->addWidget(c.txtEmailFromDesc, 0, 3);
+    grid->addWidget(txtEmailFrom, 0, 1, 1, 2);
+    grid->addWidget(txtEmailFromDesc, 0, 3);
     grid->addWidget(caption(u"נושא ההודעה:"_s), 1, 0);
-    grid->addWidget(c.txtEmailSubject, 1, 1, 1, 3);
+    grid->addWidget(txtEmailSubject, 1, 1, 1, 3);
     grid->addWidget(caption(u"תוכן ההודעה:"_s), 2, 0, Qt::AlignTop);
-    grid->addWidget(c.txtEmailContent, 2, 1, 1, 3);
+    grid->addWidget(txtEmailContent, 2, 1, 1, 3);
     grid->addWidget(caption(u"קובץ לגוף ההודעה: (html)"_s), 3, 0);
     grid->addWidget(c.txtEmailHTMLBody, 3, 1);
     grid->addWidget(c.CmdDir[1], 3, 2);
     grid->addWidget(caption(u"קובץ מצורף:"_s), 4, 0);
     grid->addWidget(c.txtEmailAttachFile, 4, 1);
     grid->addWidget(c.CmdDir[2], 4, 2);
-    grid->addWidget(c.txtEmailAttachFileDesc, 4, 3);
+    grid->addWidget(txtEmailAttachFileDesc, 4, 3);
     grid->setColumnStretch(1, 2);
     grid->setColumnStretch(3, 1);
     return group;
 }
 
-QGroupBox* buildRecipients(MainCardControls& c)
+QGroupBox* buildRecipients()
 {
     QGridLayout* grid = nullptr;
     QGroupBox* group = groupBox(u"נמענים"_s, grid);
     auto* methods = new QButtonGroup(group);
-    c.OptEmailMethod[1] = new QRadioButton(u"דיוור נפרד לכל נמען"_s);
-    c.OptEmailMethod[2] = new QRadioButton(u"דיוור בקבוצות של "_s);
+    QRadioButton* OptEmailMethod[] = {nullptr, new QRadioButton(u"דיוור נפרד לכל נמען"_s),
+                                      new QRadioButton(u"דיוור בקבוצות של "_s)};
     for (int i = 1; i <= 2; ++i) {
-        c.OptEmailMethod[i]->setObjectName(arrayName("OptEmailMethod", i));
-        methods->addButton(c.OptEmailMethod[i], i);
+        OptEmailMethod[i]->setObjectName(arrayName("OptEmailMethod", i));
+        methods->addButton(OptEmailMethod[i], i);
     }
-    c.txtEmailGroupSize = textBox(u"txtEmailGroupSize"_s, u"20"_s);
-    c.txtEmailGroupSize->setMaximumWidth(60);
-    c.txtEmailToMain = addressBox(u"txtEmailToMain"_s);
-    c.txtEmailToMainDesc = describedBox(u"txtEmailToMainDesc"_s, u"תאור הנמען הראשי"_s);
-    grid->addWidget(c.OptEmailMethod[1], 0, 0, 1, 2);
-    grid->addWidget(c.OptEmailMethod[2], 1, 0);
-    grid->addWidget(c.txtEmailGroupSize, 1, 1, Qt::AlignLeading);
+    auto* txtEmailGroupSize = textBox(u"txtEmailGroupSize"_s, u"20"_s);
+    txtEmailGroupSize->setMaximumWidth(60);
+    auto* txtEmailToMain = addressBox(u"txtEmailToMain"_s);
+    auto* txtEmailToMainDesc = describedBox(u"txtEmailToMainDesc"_s, u"תאור הנמען הראשי"_s);
+    grid->addWidget(OptEmailMethod[1], 0, 0, 1, 2);
+    grid->addWidget(OptEmailMethod[2], 1, 0);
+    grid->addWidget(txtEmailGroupSize, 1, 1, Qt::AlignLeading);
     grid->addWidget(caption(u"נמען ראשי:"_s), 2, 0);
-    grid->addWidget(c.txtEmailToMain, 2, 1, 1, 2);
-    grid->addWidget(c.txtEmailToMainDesc, 2, 3);
+    grid->addWidget(txtEmailToMain, 2, 1, 1, 2);
+    grid->addWidget(txtEmailToMainDesc, 2, 3);
     grid->setColumnStretch(2, 2);
     grid->setColumnStretch(3, 1);
     return group;
@@ -100,7 +100,7 @@ QWidget* buildEmailPage(MainCardControls& c)
     auto* page = new QWidget;
     auto* layout = new QVBoxLayout(page);
     layout->addWidget(buildMessage(c));
-    layout->addWidget(buildRecipients(c));
+    layout->addWidget(buildRecipients());
     layout->addStretch(1);
     return page;
 }

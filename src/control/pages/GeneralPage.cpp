@@ -1,6 +1,6 @@
-#include "control/ClickableLabel.h"
+#include "widgets/ClickableLabel.h"
 #include "control/MainCardControls.h"
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
 
 #include <QPushButton>

@@ -1,7 +1,8 @@
-#include "control/ClickableLabel.h"
+#include "widgets/ClickableLabel.h"
 #include "control/MainCardControls.h"
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
+#include "options/Lists.h"
 
 #include <QCheckBox>
 #include <QComboBox>
@@ -52,7 +53,6 @@ QGroupBox* buildLines(MainCardControls& c)
     int row = 0;
     for (const LineRow& line : lineRows()) {
         QCheckBox* box = checkBox(arrayName("ChkTitle", line.line), line.box);
-        c.ChkTitle[line.line] = box;
         grid->addWidget(box, row, 0);
         if (line.line == 6) {
             c.LblDept = new ClickableLabel(u"מחלקה"_s);
@@ -65,53 +65,52 @@ QGroupBox* buildLines(MainCardControls& c)
         }
         ++row;
     }
-    c.chkShowAttn = checkBox(u"chkShowAttn"_s, u"להציג כותרת לידי"_s);
-    c.chkDeptNewLine = checkBox(u"chkDeptNewLine"_s, u"להציג בשורה חדשה?"_s);
-    grid->addWidget(c.chkShowAttn, row++, 0, 1, 2);
-    grid->addWidget(c.chkDeptNewLine, row++, 0, 1, 2);
+    auto* chkShowAttn = checkBox(u"chkShowAttn"_s, u"להציג כותרת לידי"_s);
+    auto* chkDeptNewLine = checkBox(u"chkDeptNewLine"_s, u"להציג בשורה חדשה?"_s);
+    grid->addWidget(chkShowAttn, row++, 0, 1, 2);
+    grid->addWidget(chkDeptNewLine, row++, 0, 1, 2);
     grid->setColumnStretch(2, 1);
     return group;
 }
 
-QGroupBox* buildPageLayout(MainCardControls& c)
+QGroupBox* buildPageLayout()
 {
     QGridLayout* grid = nullptr;
     QGroupBox* group = groupBox(u"מבנה הדף:"_s, grid);
-    c.txtRows = textBox(u"txtRows"_s, u"8"_s);
-    c.txtCols = textBox(u"txtCols"_s, u"3"_s);
-    c.txtCopies = textBox(u"txtCopies"_s, u"1"_s);
-    c.txtStartFrom = textBox(u"txtStartFrom"_s, u"1"_s);
-    c.cmbLabFormat = listBox(u"cmbLabFormat"_s, {u"תבנית סטנדרטית"_s, u"איש קשר מעל שם חברה"_s});
-    c.cmbAddressFrom = listBox(u"cmbAddressFrom"_s,
-                               {u"כתובת למשלוח דואר"_s, u"כתובת בכרטיס"_s, u"כתובת מהמסמכים"_s});
+    auto* txtRows = textBox(u"txtRows"_s, u"8"_s);
+    auto* txtCols = textBox(u"txtCols"_s, u"3"_s);
+    auto* txtCopies = textBox(u"txtCopies"_s, u"1"_s);
+    auto* txtStartFrom = textBox(u"txtStartFrom"_s, u"1"_s);
+    auto* cmbLabFormat = listBox(u"cmbLabFormat"_s, labelTemplateEntries());
+    auto* cmbAddressFrom = listBox(u"cmbAddressFrom"_s, addressSourceEntries());
     grid->addWidget(caption(u"שורות"_s), 0, 0);
-    grid->addWidget(c.txtRows, 0, 1);
+    grid->addWidget(txtRows, 0, 1);
     grid->addWidget(caption(u"עמודות"_s), 1, 0);
-    grid->addWidget(c.txtCols, 1, 1);
+    grid->addWidget(txtCols, 1, 1);
     grid->addWidget(caption(u"עותקים:"_s), 2, 0);
-    grid->addWidget(c.txtCopies, 2, 1);
+    grid->addWidget(txtCopies, 2, 1);
     grid->addWidget(caption(u"התחל ממדבקה:"_s), 3, 0);
-    grid->addWidget(c.txtStartFrom, 3, 1);
+    grid->addWidget(txtStartFrom, 3, 1);
     grid->addWidget(caption(u"תבנית המדבקה:"_s), 4, 0);
-    grid->addWidget(c.cmbLabFormat, 4, 1);
+    grid->addWidget(cmbLabFormat, 4, 1);
     grid->addWidget(caption(u"כתובות:"_s), 5, 0);
-    grid->addWidget(c.cmbAddressFrom, 5, 1);
+    grid->addWidget(cmbAddressFrom, 5, 1);
     return group;
 }
 
-QGroupBox* buildAddressOptions(MainCardControls& c)
+QGroupBox* buildAddressOptions()
 {
     QGridLayout* grid = nullptr;
     QGroupBox* group = groupBox(u"אנשי קשר וכתובת"_s, grid);
-    c.ChkAllContact = checkBox(u"ChkAllContact"_s, u"דיוור נפרד לכל איש קשר?"_s);
-    c.chkUseCntctAddrss = checkBox(u"chkUseCntctAddrss"_s, u"אם כן, עדיפות ראשונה לכתובתו?"_s);
-    c.ChkAddressBySQL = checkBox(u"ChkAddressBySQL"_s, u"כתובת לפי ביטוי SQL:"_s);
-    c.txtSQLAddress = textBox(u"txtSQLAddress"_s);
-    c.txtSQLAddress->setLayoutDirection(Qt::LeftToRight);
-    grid->addWidget(c.ChkAllContact, 0, 0, 1, 2);
-    grid->addWidget(c.chkUseCntctAddrss, 1, 0, 1, 2);
-    grid->addWidget(c.ChkAddressBySQL, 2, 0);
-    grid->addWidget(c.txtSQLAddress, 2, 1);
+    auto* ChkAllContact = checkBox(u"ChkAllContact"_s, u"דיוור נפרד לכל איש קשר?"_s);
+    auto* chkUseCntctAddrss = checkBox(u"chkUseCntctAddrss"_s, u"אם כן, עדיפות ראשונה לכתובתו?"_s);
+    auto* ChkAddressBySQL = checkBox(u"ChkAddressBySQL"_s, u"כתובת לפי ביטוי SQL:"_s);
+    auto* txtSQLAddress = textBox(u"txtSQLAddress"_s);
+    txtSQLAddress->setLayoutDirection(Qt::LeftToRight);
+    grid->addWidget(ChkAllContact, 0, 0, 1, 2);
+    grid->addWidget(chkUseCntctAddrss, 1, 0, 1, 2);
+    grid->addWidget(ChkAddressBySQL, 2, 0);
+    grid->addWidget(txtSQLAddress, 2, 1);
     return group;
 }
 
@@ -123,8 +122,8 @@ QWidget* buildLabelPage(MainCardControls& c)
     auto* columns = new QHBoxLayout(page);
     columns->addWidget(buildLines(c));
     auto* side = new QVBoxLayout;
-    side->addWidget(buildPageLayout(c));
-    side->addWidget(buildAddressOptions(c));
+    side->addWidget(buildPageLayout());
+    side->addWidget(buildAddressOptions());
     c.CmdLabDef = button(u"CmdLabDef"_s, u"הגדרות מדבקה"_s);
     side->addWidget(c.CmdLabDef, 0, Qt::AlignLeading);
     side->addStretch(1);

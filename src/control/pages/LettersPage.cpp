@@ -1,7 +1,7 @@
 #include "control/MainCardControls.h"
-#include "control/Tag.h"
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
+#include "options/Lists.h"
 
 #include <QApplication>
 #include <QButtonGroup>
@@ -21,86 +21,57 @@ namespace pelmar {
 
 namespace {
 
-constexpr int kFixedRows = 4;
-const QString kFreeRowTag = u"5"_s;
-const QString kFixedRowTag = u"1"_s;
-
-// The merge rows: the form field each fills and, for the fixed rows, the caption and the
-// recipient column behind it.
-struct MergeRow {
-    QString formField;
-    QString caption;
-    QString column;
-};
-
-const QList<MergeRow>& mergeRows()
-{
-    static const QList<MergeRow> rows = {
-        {u"CustomerName"_s, u"שם לקוח"_s, u"CardName"_s},
-        {u"ContactName"_s, u"איש קשר"_s, u"Attn"_s},
-        {u"Position"_s, u"תפקיד"_s, u"Position"_s},
-        {u"Department"_s, u"מחלקה"_s, u"Notes1"_s},
-        {u"Field4"_s, {}, {}},
-        {u"Field5"_s, {}, {}},
-        {u"Field6"_s, {}, {}},
-        {u"Field7"_s, {}, {}},
-    };
-    return rows;
-}
-
-QGroupBox* buildMergeRows(MainCardControls& c)
+QGroupBox* buildMergeRows()
 {
     QGridLayout* grid = nullptr;
     QGroupBox* group = groupBox(u"נתונים לשילוב במכתב (Word בלבד):"_s, grid);
     grid->addWidget(caption(u"לשלב?"_s), 0, 0);
     grid->addWidget(caption(u"שם השדה במסמך"_s), 0, 1);
     grid->addWidget(caption(u"נתון לשילוב"_s), 0, 2);
-    for (int i = 0; i < 8; ++i) {
+    // A fixed row shows the data it merges; a free row a box for its SQL expression.
+    for (int i = 0; i < mergeRows().size(); ++i) {
         const MergeRow& row = mergeRows().at(i);
-        const bool free = i >= kFixedRows;
-        c.chkFaxField[i] = checkBox(arrayName("chkFaxField", i));
-        setTag(c.chkFaxField[i], free ? kFreeRowTag : kFixedRowTag);
-        c.LblFaxFormField[i] = caption(row.formField, arrayName("LblFaxFormField", i));
-        c.LblFaxFormField[i]->setLayoutDirection(Qt::LeftToRight);
-        c.LblFaxField[i] = caption(row.caption, arrayName("LblFaxField", i));
-        setTag(c.LblFaxField[i], row.column);
-        c.txtFaxExpr[i] = textBox(arrayName("txtFaxExpr", i));
-        setTag(c.txtFaxExpr[i], free ? row.formField : QString());
-        c.txtFaxExpr[i]->setLayoutDirection(Qt::LeftToRight);
-        grid->addWidget(c.chkFaxField[i], i + 1, 0);
-        grid->addWidget(c.LblFaxFormField[i], i + 1, 1);
-        grid->addWidget(free ? static_cast<QWidget*>(c.txtFaxExpr[i]) : c.LblFaxField[i], i + 1, 2);
-        (free ? static_cast<QWidget*>(c.LblFaxField[i]) : c.txtFaxExpr[i])->hide();
+        auto* formField = caption(row.formField, arrayName("LblFaxFormField", i));
+        formField->setLayoutDirection(Qt::LeftToRight);
+        QWidget* data = caption(row.caption, arrayName("LblFaxField", i));
+        if (row.free) {
+            auto* expression = textBox(arrayName("txtFaxExpr", i));
+            expression->setLayoutDirection(Qt::LeftToRight);
+            data = expression;
+        }
+        grid->addWidget(checkBox(arrayName("chkFaxField", i)), i + 1, 0);
+        grid->addWidget(formField, i + 1, 1);
+        grid->addWidget(data, i + 1, 2);
     }
     grid->setColumnStretch(2, 1);
     return group;
 }
 
-QGroupBox* buildFaxSettings(MainCardControls& c)
+QGroupBox* buildFaxSettings()
 {
     QGridLayout* grid = nullptr;
     QGroupBox* group = groupBox(u"הגדרות לפקס:"_s, grid);
     QGridLayout* serverGrid = nullptr;
-    c.FaxServerType = groupBox(u"שרת פקסים:"_s, serverGrid);
-    c.FaxServerType->setObjectName(u"FaxServerType"_s);
-    auto* transports = new QButtonGroup(c.FaxServerType);
-    c.OptOLE[1] = new QRadioButton(u"WinFax Pro 10"_s);
-    c.OptOLE[2] = new QRadioButton(u"MS Fax Service (Win 2000 sp3 or Win XP)"_s);
+    auto* FaxServerType = groupBox(u"שרת פקסים:"_s, serverGrid);
+    FaxServerType->setObjectName(u"FaxServerType"_s);
+    auto* transports = new QButtonGroup(FaxServerType);
+    QRadioButton* OptOLE[] = {nullptr, new QRadioButton(u"WinFax Pro 10"_s),
+                              new QRadioButton(u"MS Fax Service (Win 2000 sp3 or Win XP)"_s)};
     for (int i = 1; i <= 2; ++i) {
-        c.OptOLE[i]->setObjectName(arrayName("OptOLE", i));
-        transports->addButton(c.OptOLE[i], i);
-        serverGrid->addWidget(c.OptOLE[i], i - 1, 0);
+        OptOLE[i]->setObjectName(arrayName("OptOLE", i));
+        transports->addButton(OptOLE[i], i);
+        serverGrid->addWidget(OptOLE[i], i - 1, 0);
     }
-    c.txtFaxSubject = textBox(u"txtFaxSubject"_s);
-    c.txtFaxDelay = textBox(u"txtFaxDelay"_s);
-    c.TxtLocalAreaPrefix = textBox(u"TxtLocalAreaPrefix"_s);
-    grid->addWidget(c.FaxServerType, 0, 0, 1, 2);
+    auto* txtFaxSubject = textBox(u"txtFaxSubject"_s);
+    auto* txtFaxDelay = textBox(u"txtFaxDelay"_s);
+    auto* TxtLocalAreaPrefix = textBox(u"TxtLocalAreaPrefix"_s);
+    grid->addWidget(FaxServerType, 0, 0, 1, 2);
     grid->addWidget(caption(u"נושא הפקס:"_s), 1, 0);
-    grid->addWidget(c.txtFaxSubject, 1, 1);
+    grid->addWidget(txtFaxSubject, 1, 1);
     grid->addWidget(caption(u"דחיית המשלוח בדקות:"_s), 2, 0);
-    grid->addWidget(c.txtFaxDelay, 2, 1);
+    grid->addWidget(txtFaxDelay, 2, 1);
     grid->addWidget(caption(u"אזור חיוג מקומי:"_s), 3, 0);
-    grid->addWidget(c.TxtLocalAreaPrefix, 3, 1);
+    grid->addWidget(TxtLocalAreaPrefix, 3, 1);
     return group;
 }
 
@@ -128,8 +99,8 @@ QWidget* buildLettersPage(MainCardControls& c)
     templateRow->addWidget(c.CmdDir[3]);
     layout->addLayout(templateRow);
     auto* columns = new QHBoxLayout;
-    columns->addWidget(buildMergeRows(c), 3);
-    columns->addWidget(buildFaxSettings(c), 2);
+    columns->addWidget(buildMergeRows(), 3);
+    columns->addWidget(buildFaxSettings(), 2);
     layout->addLayout(columns);
     layout->addStretch(1);
     return page;

@@ -4,8 +4,8 @@
 #include "common/Failure.h"
 #include "common/Messages.h"
 #include "common/SessionState.h"
-#include "control/SetGetCtrl.h"
-#include "control/Widgets.h"
+#include "widgets/SetGetCtrl.h"
+#include "widgets/Widgets.h"
 #include "db/CompanyList.h"
 #include "db/DatabaseClient.h"
 

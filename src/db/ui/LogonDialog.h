@@ -1,6 +1,6 @@
 #pragma once
 
-#include "control/Services.h"
+#include "outputs/Services.h"
 
 #include <QDialog>
 

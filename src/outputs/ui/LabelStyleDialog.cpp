@@ -1,7 +1,7 @@
 #include "outputs/ui/LabelStyleDialog.h"
 
 #include "common/Failure.h"
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 
 #include <QCheckBox>
 #include <QComboBox>

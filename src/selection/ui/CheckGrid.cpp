@@ -1,6 +1,6 @@
 #include "selection/ui/CheckGrid.h"
 
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 #include "selection/CheckListModel.h"
 
 #include <QHeaderView>

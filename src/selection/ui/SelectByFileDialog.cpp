@@ -5,8 +5,8 @@
 #include "common/FileDialogs.h"
 #include "common/Messages.h"
 #include "common/SessionState.h"
-#include "control/SetGetCtrl.h"
-#include "control/Widgets.h"
+#include "widgets/SetGetCtrl.h"
+#include "widgets/Widgets.h"
 #include "selection/PickerData.h"
 #include "selection/SelectedCards.h"
 

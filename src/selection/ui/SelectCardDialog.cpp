@@ -3,7 +3,7 @@
 #include "common/Failure.h"
 #include "common/Messages.h"
 #include "common/SessionState.h"
-#include "control/Widgets.h"
+#include "widgets/Widgets.h"
 #include "selection/PickerData.h"
 #include "selection/SelectedCards.h"
 #include "selection/ui/CheckGrid.h"

@@ -1,0 +1,155 @@
+#include "cli/Program.h"
+#include "outputs/Initialisation.h"
+#include "outputs/Output.h"
+#include "outputs/Runs.h"
+#include "selection/SelectBuilder.h"
+#include "settings/SettingsStore.h"
+#include "support/LabelCompany.h"
+
+#include <QFile>
+
+using namespace Qt::StringLiterals;
+
+namespace pelmar::test {
+namespace {
+
+using Result = ProgramResult;
+
+// The program against the hand-made company, with this test's settings and temporary folder.
+class CommandLineTest : public LabelCompanyTest {
+protected:
+    void SetUp() override
+    {
+        LabelCompanyTest::SetUp();
+        for (const auto& [key, value] : {std::pair{u"ConnServer"_s, engine->server()}, std::pair{u"ConnUID"_s, engine->user()},
+                                         std::pair{u"ConnPWD"_s, QString()}, std::pair{u"ConnDataBase"_s, u"labels"_s}})
+            store->setValue(u"Pelmar"_s, u"Params"_s, key, value);
+        store->setValue(u"Pelmar"_s, u"Params"_s, u"Rows"_s, u"3"_s);
+        store->setValue(u"Pelmar"_s, u"Params"_s, u"UseTitle2"_s, u"1"_s);
+        store->setValue(u"Pelmar"_s, u"Params"_s, u"UseTitle5"_s, u"1"_s);
+        initialiseSession(*store, engine->client(), state, options);
+    }
+
+    Result pelmar(const QStringList& arguments) { return runProgram(folder(), arguments); }
+
+    QString setting(const QString& key) { return SettingsStore(configFolder()).value(u"Pelmar"_s, u"Params"_s, key, u"<none>"_s); }
+};
+
+TEST_F(CommandLineTest, EachCommandWritesWhatTheWindowsPathWrites)
+{
+    const QString mine = tempPath(u"mine"_s);
+    const Result labels = pelmar({u"labels"_s});
+    EXPECT_EQ(labels.exit, 0) << labels.err.toStdString();
+    EXPECT_EQ(labels.out.trimmed(), tempPath(u"pelmar1.htm"_s));
+    RunContext run = context();
+    CreateLabFile(mine, run);
+    EXPECT_EQ(readFile(tempPath(u"pelmar1.htm"_s)), readFile(mine));
+
+    EXPECT_EQ(pelmar({u"list"_s, u"--kind"_s, u"3"_s, u"-o"_s, path(u"list.htm"_s)}).exit, 0);
+    CreateHTML(mine, 3, run);
+    EXPECT_EQ(readFile(path(u"list.htm"_s)), readFile(mine));
+
+    EXPECT_EQ(pelmar({u"card"_s, u"C1"_s}).exit, 0);
+    CreateCardFile(mine, u"C1"_s, run);
+    EXPECT_EQ(readFile(tempPath(u"pelmar3.htm"_s)), readFile(mine));
+
+    const Result sms = pelmar({u"sms"_s, u"-o"_s, path(u"numbers.txt"_s)});
+    EXPECT_EQ(sms.exit, 0);
+    EXPECT_EQ(readFile(path(u"numbers.txt"_s)), QByteArray("052-999\r\n050-222\r\n054 777\r\n"));
+    EXPECT_TRUE(sms.err.contains(u"הודעה: קובץ רשימת הטלפונים הניידים מוכן"_s)) << sms.err.toStdString();
+}
+
+TEST_F(CommandLineTest, EveryOutputOfTheTableRunsWithoutAWindowOrAGuiPlatform)
+{
+    for (const Output* output : outputTable()) {
+        if (output->name().isEmpty())
+            continue;
+        QStringList arguments = {output->name(), u"-o"_s, path(u"out"_s)};
+        if (output->commandLine().argument == CommandLineUse::Argument::CardCode)
+            arguments << u"C1"_s;
+        const Result result = pelmar(arguments);
+        EXPECT_EQ(result.exit, 0) << output->name().toStdString() << ": " << result.err.toStdString();
+        EXPECT_FALSE(readFile(path(u"out"_s)).isEmpty()) << output->name().toStdString();
+        QFile::remove(path(u"out"_s));
+    }
+}
+
+TEST_F(CommandLineTest, SqlPrintsTheStatementOfEachKind)
+{
+    for (short kind = 1; kind <= 6; ++kind) {
+        const Result sql = pelmar({u"sql"_s, u"--kind"_s, QString::number(kind), u"--all-details"_s});
+        EXPECT_EQ(sql.exit, 0);
+        state.SboVersionLevel = 1;
+        EXPECT_EQ(sql.out.trimmed(), recipientStatement(options, state, kind, true, true)) << kind;
+    }
+    EXPECT_FALSE(pelmar({u"sql"_s, u"--no-order"_s}).out.contains(u"ORDER BY"_s));
+}
+
+TEST_F(CommandLineTest, SetChangesEachKindOfControlAndSaveStoresIt)
+{
+    const QStringList sets = {u"--set"_s, u"txtRows=12"_s, u"--set"_s, u"cmbLabFormat=1"_s, u"--set"_s, u"ChkTitle_7=1"_s,
+                              u"--set"_s, u"OptOLE_2=true"_s, u"--set"_s, u"LblDept=1"_s};
+    EXPECT_EQ(pelmar(QStringList{u"sql"_s} + sets).exit, 0);
+    EXPECT_EQ(setting(u"Rows"_s), u"3"_s) << "nothing is stored without --save";
+    EXPECT_EQ(pelmar(QStringList{u"sql"_s, u"--save"_s} + sets).exit, 0);
+    EXPECT_EQ(setting(u"Rows"_s), u"12"_s);
+    EXPECT_EQ(setting(u"LabFormat"_s), u"1"_s);
+    EXPECT_EQ(setting(u"UseTitle7"_s), u"1"_s);
+    EXPECT_EQ(setting(u"OptOLE2"_s), u"True"_s);
+    EXPECT_EQ(setting(u"OptOLE1"_s), u"False"_s);
+    EXPECT_EQ(setting(u"DeptField"_s), u"1"_s);
+
+    for (const QString& bad : {u"cmbLabFormat=7"_s, u"ChkTitle_7=yes"_s, u"NoSuchControl=1"_s, u"txtRows"_s}) {
+        const Result refused = pelmar({u"sql"_s, u"--set"_s, bad});
+        EXPECT_EQ(refused.exit, 2) << bad.toStdString();
+        EXPECT_TRUE(refused.err.contains(u"pelmar: "_s));
+    }
+}
+
+TEST_F(CommandLineTest, CardsGroupsAndPropertiesShapeTheRun)
+{
+    writeFile(path(u"cards.txt"_s), "\xEF\xBB\xBF" "C5\r\nC1\r\n");
+    EXPECT_EQ(pelmar({u"sms"_s, u"-o"_s, path(u"n.txt"_s), u"--cards"_s, path(u"cards.txt"_s)}).exit, 0);
+    EXPECT_EQ(readFile(path(u"n.txt"_s)), QByteArray("052-999\r\n054 777\r\n"));
+    EXPECT_EQ(pelmar({u"sms"_s, u"-o"_s, path(u"n.txt"_s), u"--card"_s, u"C2"_s}).exit, 0);
+    EXPECT_EQ(readFile(path(u"n.txt"_s)), QByteArray("050-222\r\n"));
+
+    const QString sql = pelmar({u"sql"_s, u"--groups"_s, u"100,103"_s, u"--properties"_s, u"3,17"_s, u"--relation"_s, u"or"_s}).out;
+    EXPECT_TRUE(sql.contains(u" AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s)) << sql.toStdString();
+    EXPECT_TRUE(sql.contains(u" And (OCRD.QryGroup3='Y' OR OCRD.QryGroup17='Y')"_s));
+}
+
+TEST_F(CommandLineTest, FailuresAndUsageErrorsHaveTheirExitStatus)
+{
+    const Result rows = pelmar({u"labels"_s, u"--set"_s, u"txtRows=0"_s});
+    EXPECT_EQ(rows.exit, 1);
+    EXPECT_TRUE(rows.err.startsWith(u"תקלה: "_s)) << rows.err.toStdString();
+
+    store->setValue(u"Pelmar"_s, u"Params"_s, u"ConnDataBase"_s, u"nosuchcompany"_s);
+    const Result missing = pelmar({u"labels"_s});
+    EXPECT_EQ(missing.exit, 1);
+    EXPECT_TRUE(missing.err.contains(u"תקלה"_s));
+
+    EXPECT_EQ(pelmar({u"labels"_s, u"--cards"_s, path(u"absent.txt"_s)}).exit, 2);
+    EXPECT_EQ(pelmar({u"launch"_s}).exit, 2);
+    EXPECT_EQ(pelmar({u"sms"_s}).exit, 2);
+    EXPECT_EQ(pelmar({u"list"_s, u"--kind"_s, u"1"_s}).exit, 2);
+    const Result help = pelmar({u"--help"_s});
+    EXPECT_EQ(help.exit, 0);
+    EXPECT_TRUE(help.out.contains(u"pelmar labels"_s) || help.out.contains(u"labels [-o FILE]"_s));
+    EXPECT_TRUE(pelmar({u"--version"_s}).out.startsWith(u"pelmar "_s));
+}
+
+TEST_F(CommandLineTest, DemoCreatesTheCompanyOnlyWhereNoOtherIsConfigured)
+{
+    const Result kept = pelmar({u"demo"_s});
+    EXPECT_EQ(kept.exit, 0);
+    EXPECT_TRUE(kept.out.contains(u"--force"_s));
+    EXPECT_EQ(setting(u"ConnDataBase"_s), u"labels"_s);
+    EXPECT_EQ(pelmar({u"demo"_s, u"--force"_s}).exit, 0);
+    EXPECT_EQ(setting(u"ConnDataBase"_s), u"demo"_s);
+    EXPECT_EQ(pelmar({u"labels"_s}).exit, 0);
+}
+
+}  // namespace
+}  // namespace pelmar::test
