@@ -6,7 +6,7 @@
 namespace pelmar {
 class DatabaseClient;
 struct SessionState;
-}
+}  // namespace pelmar
 
 namespace pelmar::bench {
 

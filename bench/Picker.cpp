@@ -40,7 +40,8 @@ int measurePicker(int cards)
     CheckListModel model({u"code"_s, u"check"_s, u"name"_s}, {0, CheckListModel::kCheckColumn, 1});
     QTextStream out(stdout);
     const double fill = seconds([&] {
-        readCardList(client, connString, u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName FROM OCRD ORDER BY OCRD.CardCode"_s,
+        readCardList(client, connString,
+                     u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName FROM OCRD ORDER BY OCRD.CardCode"_s,
                      [&](const QVector<CheckListModel::Row>& rows) { model.appendRows(rows); });
     });
     for (int i = 0; i < model.rowCount(); i += 7)

@@ -1,8 +1,8 @@
 #include "cardpage/CardPage.h"
 
 #include "common/Fields.h"
-#include "db/DatabaseClient.h"
 #include "common/TextFileWriter.h"
+#include "db/DatabaseClient.h"
 #include "selection/WhereBuilder.h"
 
 #include <QStringList>
@@ -59,8 +59,7 @@ public:
     CardPageWriter(TextFileWriter& file, const DatabaseClient& client, const QString& connString, const QString& code)
         : file_(file), client_(client), connString_(connString), where_(u" Where OCRD.CardCode = N'"_s + code + u"'"_s),
           code_(code)
-    {
-    }
+    {}
 
     void head()
     {
@@ -145,7 +144,8 @@ public:
         if (!(text(u"Address") + text(u"City")).isEmpty())
             row(u"כתובת למשלוח", {u"Address"_s, u"City"_s, u"ZipCode"_s, u"County"_s, u"NCountry"_s}, *card);
         if (!(text(u"MailAddres") + text(u"MailCity")).isEmpty() && text(u"MailAddres") != text(u"Address"))
-            row(u"כתובת לדואר", {u"MailAddres"_s, u"MailCity"_s, u"MailZipCod"_s, u"MailCounty"_s, u"NMailCountr"_s}, *card);
+            row(u"כתובת לדואר", {u"MailAddres"_s, u"MailCity"_s, u"MailZipCod"_s, u"MailCounty"_s, u"NMailCountr"_s},
+                *card);
         sectionEnd();
     }
 
@@ -160,10 +160,12 @@ public:
                                  connString_);
         if (rows->eof())
             return;
-        sectionStart(u"כתובות", {u"סוג"_s, u"רחוב/תא דואר"_s, u"גוש"_s, u"עיר"_s, u"מיקוד"_s, u"מחוז"_s, u"מדינה"_s, u"ארץ"_s});
+        sectionStart(u"כתובות",
+                     {u"סוג"_s, u"רחוב/תא דואר"_s, u"גוש"_s, u"עיר"_s, u"מיקוד"_s, u"מחוז"_s, u"מדינה"_s, u"ארץ"_s});
         for (; !rows->eof(); rows->moveNext())
-            row(nullptr, {u"Address"_s, u"Street"_s, u"Block"_s, u"City"_s, u"ZipCode"_s, u"County"_s, u"NState"_s,
-                          u"NCountry"_s},
+            row(nullptr,
+                {u"Address"_s, u"Street"_s, u"Block"_s, u"City"_s, u"ZipCode"_s, u"County"_s, u"NState"_s,
+                 u"NCountry"_s},
                 *rows);
         sectionEnd();
     }
@@ -177,19 +179,21 @@ public:
                                  connString_);
         if (rows->eof())
             return;
-        sectionStart(u"אנשי קשר", {u"שם"_s, u"תפקיד"_s, u"טל. 1"_s, u"טל. 2"_s, u"טל. נייד"_s, u"פקס"_s, u"EMail"_s,
-                                   u"זימונית"_s, u"הערות 1"_s, u"הערות 2"_s});
+        sectionStart(u"אנשי קשר",
+                     {u"שם"_s, u"תפקיד"_s, u"טל. 1"_s, u"טל. 2"_s, u"טל. נייד"_s, u"פקס"_s, u"EMail"_s, u"זימונית"_s,
+                      u"הערות 1"_s, u"הערות 2"_s});
         for (; !rows->eof(); rows->moveNext())
-            row(nullptr, {u"Name"_s, u"Position"_s, u"Tel1"_s, u"Tel2"_s, u"Cellolar"_s, u"Fax"_s, u"E_MailL"_s,
-                          u"Pager"_s, u"Notes1"_s, u"Notes2"_s},
+            row(nullptr,
+                {u"Name"_s, u"Position"_s, u"Tel1"_s, u"Tel2"_s, u"Cellolar"_s, u"Fax"_s, u"E_MailL"_s, u"Pager"_s,
+                 u"Notes1"_s, u"Notes2"_s},
                 *rows);
         sectionEnd();
     }
 
     void foot()
     {
-        for (const char16_t* line : {u"</table>", u"<p class=Tarvel align='center'>טרבל מערכות מידע</p>", u"</BODY>",
-                                     u"</HTML>"})
+        for (const char16_t* line :
+             {u"</table>", u"<p class=Tarvel align='center'>טרבל מערכות מידע</p>", u"</BODY>", u"</HTML>"})
             file_.line(line);
     }
 
@@ -209,9 +213,10 @@ private:
 
     void block(const QStringList& captions, const std::function<void()>& values)
     {
-        for (const char16_t* line : {u"  <tr align='right'>", u"   <td>",
-                                     u"   <table class=TblClean width='100%' border='0' cellpadding='2' cellspacing='2'>",
-                                     u"    <tr align='right'>"})
+        for (const char16_t* line :
+             {u"  <tr align='right'>", u"   <td>",
+              u"   <table class=TblClean width='100%' border='0' cellpadding='2' cellspacing='2'>",
+              u"    <tr align='right'>"})
             file_.line(line);
         for (const QString& caption : captions)
             file_.line(u"     <td class=Cap>"_s + caption + u"</td>"_s);
@@ -266,8 +271,8 @@ private:
 
 }  // namespace
 
-void writeCardPage(const QString& path, const QString& cardCode, const DatabaseClient& client, const QString& connString,
-                   short level)
+void writeCardPage(const QString& path, const QString& cardCode, const DatabaseClient& client,
+                   const QString& connString, short level)
 {
     TextFileWriter file(path, true);
     CardPageWriter page(file, client, connString, sqlText(cardCode));

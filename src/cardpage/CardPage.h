@@ -14,7 +14,7 @@ inline constexpr char16_t kCardPageAddress[] = u"http://www.pelmar.co.il/";
 // read straight from the company database. The code's apostrophes are doubled in the statements.
 // A code that matches no card leaves the page ending after its head. Database values are
 // HTML-escaped; Null shows as "&nbsp;". Throws Failure on a database or file failure.
-void writeCardPage(const QString& path, const QString& cardCode, const DatabaseClient& client, const QString& connString,
-                   short level);
+void writeCardPage(const QString& path, const QString& cardCode, const DatabaseClient& client,
+                   const QString& connString, short level);
 
 }  // namespace pelmar

@@ -166,7 +166,8 @@ int runCommandLine(const QStringList& arguments)
         }
         return line.command == u"demo"_s ? runDemo(line) : runCommand(line);
     } catch (const UsageError& usage) {
-        err() << u"pelmar: "_s << usage.message() << Qt::endl << u"Run \"pelmar --help\" for the commands."_s << Qt::endl;
+        err() << u"pelmar: "_s << usage.message() << Qt::endl
+              << u"Run \"pelmar --help\" for the commands."_s << Qt::endl;
         return 2;
     } catch (const Failure& failure) {
         err() << u"תקלה: "_s << failure.description() << Qt::endl;

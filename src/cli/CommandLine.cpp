@@ -201,7 +201,8 @@ QString usageText()
        pelmar COMMAND [options]     run headless from the saved settings
 
 Commands:
-)"_s + commands + uR"(
+)"_s + commands
+        + uR"(
 Options for every command:
   --set NAME=VALUE      set a control after the settings are loaded (text, list index, 0/1,
                         true/false, or LblDept's tag); repeatable

@@ -63,7 +63,8 @@ void ConsoleBrowser::open(const QString& path)
         browser_.open(path);
 }
 
-ConsoleProgress::ConsoleProgress() : terminal_(::isatty(STDERR_FILENO) != 0) {}
+ConsoleProgress::ConsoleProgress() : terminal_(::isatty(STDERR_FILENO) != 0)
+{}
 
 void ConsoleProgress::report(const QString& text, double fraction)
 {

@@ -5,6 +5,7 @@
 namespace pelmar {
 
 Failure::Failure(QString description, long number)
-    : description_(std::move(description)), number_(number), utf8_(description_.toUtf8()) {}
+    : description_(std::move(description)), number_(number), utf8_(description_.toUtf8())
+{}
 
 }  // namespace pelmar

@@ -16,10 +16,10 @@ struct CardGroupSel {
 
 // The style of one label line. Fields are 0..255; the fixed text is used by lines 11 and 12.
 struct LabelDefRec {
-    unsigned char Font = 0;        // 0 Arial, 1 David, 2 Miriam
-    unsigned char FontSize = 0;    // points
+    unsigned char Font = 0;  // 0 Arial, 1 David, 2 Miriam
+    unsigned char FontSize = 0;  // points
     unsigned char FontWeight = 0;  // 0 Normal, 1 Bolder, 2 Bold
-    unsigned char FontUL = 0;      // 1 underlined
+    unsigned char FontUL = 0;  // 1 underlined
     unsigned char FontItalic = 0;  // 1 italic
     QString FixedText;
     bool operator==(const LabelDefRec&) const = default;

@@ -9,9 +9,9 @@ namespace pelmar {
 
 // How a piece of text goes into an HTML file.
 enum class Html {
-    Markup,         // as it is: the file's own markup
-    Text,           // a value: "&", "<", ">" and '"' become entities
-    TextCrBr,       // a value whose carriage returns become "<br>"
+    Markup,  // as it is: the file's own markup
+    Text,  // a value: "&", "<", ">" and '"' become entities
+    TextCrBr,  // a value whose carriage returns become "<br>"
     TextCrCommaBr,  // a value whose carriage returns and commas become "<br>"
 };
 

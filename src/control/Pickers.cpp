@@ -17,10 +17,11 @@ void MainCard::cmdSelectAccount_Click()
 {
     c_.ChkSelectAccount->setChecked(true);
     c_.ChkItems->setChecked(false);
-    const bool rebuild = state_.CardListSQL.isEmpty()
-                         || services_.messages.question(u"שימו לב"_s, u"לסרוק מחדש את רשימת הכרטיסים?"_s);
+    const bool rebuild
+        = state_.CardListSQL.isEmpty() || services_.messages.question(u"שימו לב"_s, u"לסרוק מחדש את רשימת הכרטיסים?"_s);
     if (rebuild) {
-        const bool built = guarded([&] { state_.CardListSQL = recipientStatement(options_, state_, kCardList, false, true); });
+        const bool built
+            = guarded([&] { state_.CardListSQL = recipientStatement(options_, state_, kCardList, false, true); });
         if (!built)
             return;
         cardPicker_.reset();

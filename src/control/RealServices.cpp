@@ -8,8 +8,7 @@ namespace pelmar {
 RealServices::RealServices()
     : settings_(SettingsStore::forCurrentUser()),
       database_(chooseSqlServerDriver(configuredSqlServerDriver(settings_), installedOdbcDrivers()))
-{
-}
+{}
 
 Services RealServices::services()
 {

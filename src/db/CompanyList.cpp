@@ -15,12 +15,11 @@ constexpr int kListLoginTimeout = 10;
 
 }  // namespace
 
-void listCompanyDatabases(const DatabaseClient& client, const QString& server, const QString& uid,
-                          const QString& pwd, const std::function<void(const QString&)>& add)
+void listCompanyDatabases(const DatabaseClient& client, const QString& server, const QString& uid, const QString& pwd,
+                          const std::function<void(const QString&)>& add)
 {
     const QString connString = BuildConnString(server, uid, pwd, u"sbo-common"_s);
-    auto companies = client.open(u"SELECT dbName, cmpName FROM SRGC ORDER BY dbName"_s, connString,
-                                 kListLoginTimeout);
+    auto companies = client.open(u"SELECT dbName, cmpName FROM SRGC ORDER BY dbName"_s, connString, kListLoginTimeout);
     for (; !companies->eof(); companies->moveNext())
         add(FieldText(companies->value(u"DBName"_s)));
 }
@@ -33,8 +32,8 @@ QStringList databasesToCheck(const QString& text)
     return names.split(u';');
 }
 
-void checkCompanyDatabase(const DatabaseClient& client, const QString& server, const QString& uid,
-                          const QString& pwd, const QString& database)
+void checkCompanyDatabase(const DatabaseClient& client, const QString& server, const QString& uid, const QString& pwd,
+                          const QString& database)
 {
     client.open(u"SELECT * FROM OCRD"_s, BuildConnString(server, uid, pwd, database), kListLoginTimeout);
 }

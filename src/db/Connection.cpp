@@ -24,7 +24,8 @@ void LoadConnSettings(const SettingsStore& store, SessionState& state)
     state.ConnServer = store.value(kPelmarApp, kParamsSection, u"ConnServer"_s, u"server"_s);
     state.ConnUID = store.value(kPelmarApp, kParamsSection, u"ConnUID"_s, u"sa"_s);
     state.ConnPWD = store.value(kPelmarApp, kParamsSection, u"ConnPWD"_s, {});
-    state.ConnDataBase = store.value(kPelmarApp, kParamsSection, u"ConnDataBase"_s, QString::fromUtf16(kUnconfiguredDatabase));
+    state.ConnDataBase
+        = store.value(kPelmarApp, kParamsSection, u"ConnDataBase"_s, QString::fromUtf16(kUnconfiguredDatabase));
 }
 
 QString configuredSqlServerDriver(const SettingsStore& store)
@@ -41,8 +42,7 @@ bool TestConnection(const DatabaseClient& client, const SessionState& state, con
 {
     const QString name = database.isEmpty() ? state.ConnDataBase : database;
     try {
-        client.connect(BuildConnString(state.ConnServer, state.ConnUID, state.ConnPWD, name),
-                       kStartupLoginTimeout);
+        client.connect(BuildConnString(state.ConnServer, state.ConnUID, state.ConnPWD, name), kStartupLoginTimeout);
     } catch (const Failure& failure) {
         return failure.number() == kIgnoredOpenError;
     }

@@ -42,9 +42,7 @@ const std::vector<Layout>& layouts()
           {u";PWD=", Field::Password},
           {u";Database=", Field::Database}},
          false},
-        {{{u"Provider=SQLNCLI;Server=", Field::Server},
-          {u";Trusted_Connection=yes;Database=", Field::Database}},
-         true},
+        {{{u"Provider=SQLNCLI;Server=", Field::Server}, {u";Trusted_Connection=yes;Database=", Field::Database}}, true},
         {{{u"DSN=", Field::Server}, {u";Uid=", Field::User}, {u";Pwd=", Field::Password}}, false, true},
     };
     return all;
@@ -115,7 +113,7 @@ QString odbcQuoted(const QString& value)
 {
     static const QString special = QStringLiteral(";{}=");
     const bool plain = std::none_of(value.begin(), value.end(), [](QChar c) { return special.contains(c); })
-                       && value.trimmed() == value;
+        && value.trimmed() == value;
     if (plain)
         return value;
     QString quoted = value;

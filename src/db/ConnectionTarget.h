@@ -10,13 +10,13 @@ struct ConnectionTarget {
     enum class Kind { SqlServer, DataSourceName, Embedded };
 
     Kind kind = Kind::SqlServer;
-    QString host;            // SQL Server host (may carry "\instance"); the data source name
-    int port = 0;            // 0 when the server names no port
+    QString host;  // SQL Server host (may carry "\instance"); the data source name
+    int port = 0;  // 0 when the server names no port
     QString user;
     QString password;
     QString database;
-    bool integrated = false; // Windows authentication
-    QString folder;          // Embedded: the folder of the "<database>.sqlite" files
+    bool integrated = false;  // Windows authentication
+    QString folder;  // Embedded: the folder of the "<database>.sqlite" files
 
     // Reads a string of any kind BuildConnString makes. A server written "sqlite:<folder>"
     // names the embedded engine. Throws Failure for any other string.

@@ -8,7 +8,8 @@
 
 namespace pelmar {
 
-DatabaseClient::DatabaseClient(QString sqlServerDriver) : sqlServerDriver_(std::move(sqlServerDriver)) {}
+DatabaseClient::DatabaseClient(QString sqlServerDriver) : sqlServerDriver_(std::move(sqlServerDriver))
+{}
 
 std::unique_ptr<DatabaseConnection> DatabaseClient::openConnection(const QString& connString,
                                                                    int loginTimeoutSeconds) const
@@ -18,13 +19,14 @@ std::unique_ptr<DatabaseConnection> DatabaseClient::openConnection(const QString
         const QString file = target.embeddedFile();
         if (!QFileInfo(file).isFile())
             throw Failure(QStringLiteral("Cannot open database \"%1\" requested by the login: "
-                                         "there is no file %2.").arg(target.database, file));
+                                         "there is no file %2.")
+                              .arg(target.database, file));
         return std::make_unique<DatabaseConnection>(QStringLiteral("QSQLITE"), file,
                                                     QStringLiteral("QSQLITE_OPEN_READONLY"), true);
     }
     const QString options = QStringLiteral("SQL_ATTR_LOGIN_TIMEOUT=%1").arg(loginTimeoutSeconds);
-    return std::make_unique<DatabaseConnection>(QStringLiteral("QODBC"), target.odbcString(sqlServerDriver_),
-                                                options, false);
+    return std::make_unique<DatabaseConnection>(QStringLiteral("QODBC"), target.odbcString(sqlServerDriver_), options,
+                                                false);
 }
 
 std::unique_ptr<Recordset> DatabaseClient::open(const QString& sql, const QString& connString,

@@ -30,8 +30,7 @@ public:
     const QString& sqlServerDriver() const { return sqlServerDriver_; }
 
 private:
-    std::unique_ptr<DatabaseConnection> openConnection(const QString& connString,
-                                                       int loginTimeoutSeconds) const;
+    std::unique_ptr<DatabaseConnection> openConnection(const QString& connString, int loginTimeoutSeconds) const;
 
     QString sqlServerDriver_;
 };

@@ -29,8 +29,8 @@ Failure failureOf(const QSqlError& error)
     return Failure(description, numeric && number != 0 ? number : Failure::kUnspecified);
 }
 
-DatabaseConnection::DatabaseConnection(const QString& driverType, const QString& databaseName,
-                                       const QString& options, bool embedded)
+DatabaseConnection::DatabaseConnection(const QString& driverType, const QString& databaseName, const QString& options,
+                                       bool embedded)
     : name_(uniqueName()), embedded_(embedded)
 {
     QSqlDatabase db = QSqlDatabase::addDatabase(driverType, name_);

@@ -13,8 +13,7 @@ class DatabaseConnection {
 public:
     // Opens the connection; throws Failure with the driver's description when it cannot.
     // embedded: the statements must be adapted to the embedded engine's literals.
-    DatabaseConnection(const QString& driverType, const QString& databaseName,
-                       const QString& options, bool embedded);
+    DatabaseConnection(const QString& driverType, const QString& databaseName, const QString& options, bool embedded);
     ~DatabaseConnection();
     DatabaseConnection(const DatabaseConnection&) = delete;
     DatabaseConnection& operator=(const DatabaseConnection&) = delete;

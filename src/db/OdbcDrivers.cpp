@@ -17,8 +17,8 @@ QStringList installedOdbcDrivers()
     SQLSMALLINT descriptionLength = 0;
     SQLSMALLINT attributesLength = 0;
     SQLUSMALLINT direction = SQL_FETCH_FIRST;
-    while (SQL_SUCCEEDED(SQLDrivers(env, direction, description, sizeof description, &descriptionLength,
-                                    attributes, sizeof attributes, &attributesLength))) {
+    while (SQL_SUCCEEDED(SQLDrivers(env, direction, description, sizeof description, &descriptionLength, attributes,
+                                    sizeof attributes, &attributesLength))) {
         names << QString::fromUtf8(reinterpret_cast<const char*>(description));
         direction = SQL_FETCH_NEXT;
     }

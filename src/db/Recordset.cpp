@@ -55,8 +55,7 @@ void Recordset::moveFirst()
 void Recordset::moveNext()
 {
     if (eof_)
-        throw Failure(QStringLiteral("Either BOF or EOF is True, or the current record has been deleted."),
-                      3021);
+        throw Failure(QStringLiteral("Either BOF or EOF is True, or the current record has been deleted."), 3021);
     bof_ = false;
     readRow();
 }
@@ -82,7 +81,8 @@ int Recordset::requiredColumn(const QString& column) const
     const int index = columnIndex(column);
     if (index < 0)
         throw Failure(QStringLiteral("Item cannot be found in the collection corresponding to the "
-                                     "requested name or ordinal (%1).").arg(column),
+                                     "requested name or ordinal (%1).")
+                          .arg(column),
                       3265);
     return index;
 }
@@ -90,8 +90,7 @@ int Recordset::requiredColumn(const QString& column) const
 QVariant Recordset::value(const QString& column) const
 {
     if (eof_)
-        throw Failure(QStringLiteral("Either BOF or EOF is True, or the current record has been deleted."),
-                      3021);
+        throw Failure(QStringLiteral("Either BOF or EOF is True, or the current record has been deleted."), 3021);
     return row_.at(requiredColumn(column));
 }
 

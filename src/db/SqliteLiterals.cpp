@@ -55,8 +55,8 @@ QString adaptLiteralsForSqlite(const QString& sql)
             i = end;
             continue;
         }
-        const bool nationalPrefix = (c == u'N' || c == u'n') && i + 1 < sql.size()
-                                    && sql.at(i + 1) == u'\'' && (i == 0 || !isNameChar(sql.at(i - 1)));
+        const bool nationalPrefix = (c == u'N' || c == u'n') && i + 1 < sql.size() && sql.at(i + 1) == u'\''
+            && (i == 0 || !isNameChar(sql.at(i - 1)));
         if (!nationalPrefix)
             out += c;
         ++i;

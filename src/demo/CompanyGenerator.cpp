@@ -27,7 +27,10 @@ public:
     int below(int n) { return static_cast<int>(next() % static_cast<std::uint64_t>(n)); }
     bool chance(int percent) { return below(100) < percent; }
     template <typename List>
-    auto pick(const List& list) { return list.at(below(static_cast<int>(list.size()))); }
+    auto pick(const List& list)
+    {
+        return list.at(below(static_cast<int>(list.size())));
+    }
     QString digits(int count)
     {
         QString text;
@@ -40,17 +43,17 @@ private:
     std::uint64_t state_;
 };
 
-const QStringList kHebrewLast = {u"כהן"_s, u"לוי"_s, u"מזרחי"_s, u"פרץ"_s, u"ביטון"_s, u"אברהם"_s, u"פרידמן"_s,
-                                 u"שפירא"_s, u"גולדברג"_s, u"אזולאי"_s, u"חדד"_s, u"רוזנברג"_s};
-const QStringList kHebrewFirst = {u"משה"_s, u"יוסי"_s, u"דנה"_s, u"רונית"_s, u"אבי"_s, u"מיכל"_s, u"נועה"_s,
-                                  u"דוד"_s, u"שרה"_s, u"איתן"_s};
+const QStringList kHebrewLast = {u"כהן"_s,    u"לוי"_s,   u"מזרחי"_s,   u"פרץ"_s,    u"ביטון"_s, u"אברהם"_s,
+                                 u"פרידמן"_s, u"שפירא"_s, u"גולדברג"_s, u"אזולאי"_s, u"חדד"_s,   u"רוזנברג"_s};
+const QStringList kHebrewFirst
+    = {u"משה"_s, u"יוסי"_s, u"דנה"_s, u"רונית"_s, u"אבי"_s, u"מיכל"_s, u"נועה"_s, u"דוד"_s, u"שרה"_s, u"איתן"_s};
 const QStringList kHebrewSuffix = {u"בע\"מ"_s, u"ובניו"_s, u"שיווק והפצה"_s, u"תעשיות"_s, u"סחר"_s};
-const QStringList kEnglishLast = {u"Smith"_s, u"Johnson"_s, u"Brown"_s, u"Miller"_s, u"Davis"_s, u"Wilson"_s,
-                                  u"Taylor"_s, u"Clark"_s};
+const QStringList kEnglishLast
+    = {u"Smith"_s, u"Johnson"_s, u"Brown"_s, u"Miller"_s, u"Davis"_s, u"Wilson"_s, u"Taylor"_s, u"Clark"_s};
 const QStringList kEnglishFirst = {u"John"_s, u"Mary"_s, u"Robert"_s, u"Linda"_s, u"James"_s, u"Susan"_s};
 const QStringList kEnglishSuffix = {u"Ltd"_s, u"Trading"_s, u"& Co"_s, u"Industries"_s, u"Imports"_s};
-const QStringList kHebrewCities = {u"חיפה"_s, u"תל אביב"_s, u"ירושלים"_s, u"באר שבע"_s, u"נתניה"_s,
-                                   u"קריית שמונה"_s, u"ראשון לציון"_s, u"עכו"_s};
+const QStringList kHebrewCities
+    = {u"חיפה"_s, u"תל אביב"_s, u"ירושלים"_s, u"באר שבע"_s, u"נתניה"_s, u"קריית שמונה"_s, u"ראשון לציון"_s, u"עכו"_s};
 const QStringList kEnglishCities = {u"Springfield"_s, u"London"_s, u"New York"_s, u"Berlin"_s, u"Boston"_s};
 const QStringList kHebrewStreets = {u"הרצל"_s, u"ויצמן"_s, u"הגפן"_s, u"בן גוריון"_s, u"ז'בוטינסקי"_s};
 const QStringList kEnglishStreets = {u"Main St"_s, u"High Street"_s, u"Oak Ave"_s, u"Church Rd"_s};
@@ -101,17 +104,22 @@ private:
     void writeLookups()
     {
         add(u"CINF"_s, {options_.companyName, options_.schemaLevel == 1 ? 900045 : 61012});
-        const QList<std::tuple<int, QString, QString>> groups = {
-            {100, u"לקוחות רגילים"_s, u"C"_s}, {101, u"לקוחות VIP"_s, u"C"_s}, {102, u"סיטונאים"_s, u"C"_s},
-            {103, u"Export"_s, u"C"_s},        {104, u"מוסדות"_s, u"C"_s},      {105, u"ספקים מקומיים"_s, u"S"_s},
-            {106, u"ספקי חו\"ל"_s, u"S"_s},    {107, u"קבלני משנה"_s, u"S"_s},  {108, u""_s, u"S"_s}};
+        const QList<std::tuple<int, QString, QString>> groups
+            = {{100, u"לקוחות רגילים"_s, u"C"_s}, {101, u"לקוחות VIP"_s, u"C"_s}, {102, u"סיטונאים"_s, u"C"_s},
+               {103, u"Export"_s, u"C"_s},        {104, u"מוסדות"_s, u"C"_s},     {105, u"ספקים מקומיים"_s, u"S"_s},
+               {106, u"ספקי חו\"ל"_s, u"S"_s},    {107, u"קבלני משנה"_s, u"S"_s}, {108, u""_s, u"S"_s}};
         for (const auto& [code, name, type] : groups)
             add(u"OCRG"_s, {code, name, type});
         for (int n = 1; n <= options_.properties; ++n)
             add(u"OCQG"_s, {n, n == 13 ? QString() : u"מאפיין %1"_s.arg(n)});
-        const QList<Sales> sales = {{-1, u"-ללא איש מכירות-"_s}, {1, u"דנה לוי"_s},   {2, u"יוסי כהן"_s},
-                                    {3, u"  Mark Smith  "_s},    {4, u""_s},         {5, u"רונית אברהם"_s},
-                                    {6, null()},                 {7, u"O'Neil & <Partners>"_s}};
+        const QList<Sales> sales = {{-1, u"-ללא איש מכירות-"_s},
+                                    {1, u"דנה לוי"_s},
+                                    {2, u"יוסי כהן"_s},
+                                    {3, u"  Mark Smith  "_s},
+                                    {4, u""_s},
+                                    {5, u"רונית אברהם"_s},
+                                    {6, null()},
+                                    {7, u"O'Neil & <Partners>"_s}};
         for (const Sales& employee : sales)
             add(u"OSLP"_s, {employee.code, employee.name});
         add(u"OCRY"_s, {u"IL"_s, u"ישראל"_s});
@@ -239,12 +247,34 @@ private:
         if (random_.chance(5) && !mailStreet.isNull())
             mailStreet = mailStreet.toString() + u"\r\n"_s + u"קומה 2"_s;
 
-        QVariantList row = {code, name, random_.chance(50) ? QVariant(u"Foreign %1"_s.arg(i)) : null(), type, group,
-                            mainContact, billStreet, bill.zip, bill.city, bill.county, bill.country, bill.state,
-                            bill.block, mailStreet, mail.zip, mailCity, mail.county, mail.country, mail.state,
-                            mail.block, phone(10, u"04"_s), phone(50, u"03"_s), mobile(20), phone(40, u"04"_s),
-                            email(u"info%1"_s.arg(i), 15), random_.pick(QList<int>{-1, 1, 2, 3, 5, 7}),
-                            random_.digits(9), random_.chance(70) ? null() : QVariant(u"הערה לכרטיס %1"_s.arg(i)),
+        QVariantList row = {code,
+                            name,
+                            random_.chance(50) ? QVariant(u"Foreign %1"_s.arg(i)) : null(),
+                            type,
+                            group,
+                            mainContact,
+                            billStreet,
+                            bill.zip,
+                            bill.city,
+                            bill.county,
+                            bill.country,
+                            bill.state,
+                            bill.block,
+                            mailStreet,
+                            mail.zip,
+                            mailCity,
+                            mail.county,
+                            mail.country,
+                            mail.state,
+                            mail.block,
+                            phone(10, u"04"_s),
+                            phone(50, u"03"_s),
+                            mobile(20),
+                            phone(40, u"04"_s),
+                            email(u"info%1"_s.arg(i), 15),
+                            random_.pick(QList<int>{-1, 1, 2, 3, 5, 7}),
+                            random_.digits(9),
+                            random_.chance(70) ? null() : QVariant(u"הערה לכרטיס %1"_s.arg(i)),
                             null()};
         for (int n = 1; n <= 64; ++n)
             row << (random_.below(8) == 0 ? u"Y"_s : u"N"_s);
@@ -266,23 +296,25 @@ private:
         } else if (roll < 30) {
             address = u"ת.ד 5"_s;
         }
-        add(u"OCPR"_s, {contactCode, card, name,
-                        random_.chance(30) ? null() : QVariant(random_.pick(kPositions)), address, phone(20, u"04"_s),
-                        phone(70, u"04"_s), mobile(30), phone(60, u"04"_s),
-                        email(u"contact%1"_s.arg(contactCode), 30), phone(90, u"077"_s),
-                        random_.chance(30) ? null() : QVariant(random_.pick(kDepartments)),
-                        random_.chance(80) ? null() : QVariant(u"הערה"_s)});
+        add(u"OCPR"_s,
+            {contactCode, card, name, random_.chance(30) ? null() : QVariant(random_.pick(kPositions)), address,
+             phone(20, u"04"_s), phone(70, u"04"_s), mobile(30), phone(60, u"04"_s),
+             email(u"contact%1"_s.arg(contactCode), 30), phone(90, u"077"_s),
+             random_.chance(30) ? null() : QVariant(random_.pick(kDepartments)),
+             random_.chance(80) ? null() : QVariant(u"הערה"_s)});
     }
 
     void writeAddressRows(const QString& card, const Place& bill, const Place& mail, const QVariant& billStreet)
     {
         if (random_.chance(15))
             return;
-        add(u"CRD1"_s, {card, u"כתובת ראשית"_s, u"B"_s, billStreet, bill.block, bill.city, bill.zip, bill.county,
-                        bill.state, bill.country});
+        add(u"CRD1"_s,
+            {card, u"כתובת ראשית"_s, u"B"_s, billStreet, bill.block, bill.city, bill.zip, bill.county, bill.state,
+             bill.country});
         if (random_.chance(50))
-            add(u"CRD1"_s, {card, u"משלוח"_s, u"S"_s, mail.street, mail.block, mail.city, mail.zip, mail.county,
-                            mail.state, mail.country});
+            add(u"CRD1"_s,
+                {card, u"משלוח"_s, u"S"_s, mail.street, mail.block, mail.city, mail.zip, mail.county, mail.state,
+                 mail.country});
     }
 
     void writeDocuments(const QString& card, const QString& name, const QString& type, const QList<int>& contacts)
@@ -297,8 +329,9 @@ private:
             const QDate date(2003 + random_.below(23), random_.below(12) + 1, random_.below(28) + 1);
             const QVariant contact = contacts.isEmpty() || random_.chance(20) ? QVariant(QMetaType::fromType<int>())
                                                                               : QVariant(random_.pick(contacts));
-            add(table, {entry, 1000 + entry, card, name, date, contact,
-                        random_.chance(20) ? null() : QVariant(u"כתובת מסמך %1"_s.arg(entry))});
+            add(table,
+                {entry, 1000 + entry, card, name, date, contact,
+                 random_.chance(20) ? null() : QVariant(u"כתובת מסמך %1"_s.arg(entry))});
             if (document.lines)
                 writeLines(table == u"OINV"_s ? u"INV1"_s : u"RIN1"_s, entry);
         }
@@ -309,8 +342,8 @@ private:
         const int count = random_.below(3) + 1;
         for (int line = 0; line < count; ++line) {
             const int item = random_.below(300) + 1;
-            const QString code = item % 97 == 0 ? u"I'%1"_s.arg(item, 4, 10, QChar(u'0'))
-                                                : u"I%1"_s.arg(item, 4, 10, QChar(u'0'));
+            const QString code
+                = item % 97 == 0 ? u"I'%1"_s.arg(item, 4, 10, QChar(u'0')) : u"I%1"_s.arg(item, 4, 10, QChar(u'0'));
             add(table, {entry, line, code});
         }
     }

@@ -30,15 +30,35 @@ const QString kFlag = u"CHAR(1)"_s;
 
 QList<QPair<QString, QString>> cardColumns()
 {
-    QList<QPair<QString, QString>> columns = {
-        {u"CardCode"_s, kCode}, {u"CardName"_s, kText}, {u"CardFName"_s, kText}, {u"CardType"_s, kFlag},
-        {u"GroupCode"_s, u"INTEGER"_s}, {u"CntctPrsn"_s, kText}, {u"Address"_s, kText}, {u"ZipCode"_s, kShort},
-        {u"City"_s, kText}, {u"County"_s, kText}, {u"Country"_s, u"VARCHAR(3)"_s}, {u"State1"_s, u"VARCHAR(3)"_s},
-        {u"Block"_s, kText}, {u"MailAddres"_s, kText}, {u"MailZipCod"_s, kShort}, {u"MailCity"_s, kText},
-        {u"MailCounty"_s, kText}, {u"MailCountr"_s, u"VARCHAR(3)"_s}, {u"State2"_s, u"VARCHAR(3)"_s},
-        {u"MailBlock"_s, kText}, {u"Phone1"_s, kShort}, {u"Phone2"_s, kShort}, {u"Cellular"_s, kShort},
-        {u"Fax"_s, kShort}, {u"E_Mail"_s, kText}, {u"SlpCode"_s, u"INTEGER"_s}, {u"LicTradNum"_s, u"VARCHAR(32)"_s},
-        {u"Notes"_s, kText}, {u"Free_Text"_s, u"TEXT"_s}};
+    QList<QPair<QString, QString>> columns = {{u"CardCode"_s, kCode},
+                                              {u"CardName"_s, kText},
+                                              {u"CardFName"_s, kText},
+                                              {u"CardType"_s, kFlag},
+                                              {u"GroupCode"_s, u"INTEGER"_s},
+                                              {u"CntctPrsn"_s, kText},
+                                              {u"Address"_s, kText},
+                                              {u"ZipCode"_s, kShort},
+                                              {u"City"_s, kText},
+                                              {u"County"_s, kText},
+                                              {u"Country"_s, u"VARCHAR(3)"_s},
+                                              {u"State1"_s, u"VARCHAR(3)"_s},
+                                              {u"Block"_s, kText},
+                                              {u"MailAddres"_s, kText},
+                                              {u"MailZipCod"_s, kShort},
+                                              {u"MailCity"_s, kText},
+                                              {u"MailCounty"_s, kText},
+                                              {u"MailCountr"_s, u"VARCHAR(3)"_s},
+                                              {u"State2"_s, u"VARCHAR(3)"_s},
+                                              {u"MailBlock"_s, kText},
+                                              {u"Phone1"_s, kShort},
+                                              {u"Phone2"_s, kShort},
+                                              {u"Cellular"_s, kShort},
+                                              {u"Fax"_s, kShort},
+                                              {u"E_Mail"_s, kText},
+                                              {u"SlpCode"_s, u"INTEGER"_s},
+                                              {u"LicTradNum"_s, u"VARCHAR(32)"_s},
+                                              {u"Notes"_s, kText},
+                                              {u"Free_Text"_s, u"TEXT"_s}};
     for (int n = 1; n <= 64; ++n)
         columns.append({u"QryGroup"_s + QString::number(n), kFlag});
     return columns;
@@ -48,8 +68,13 @@ TableSchema documentTable(const QString& name, const QString& cardField, const Q
                           const QString& dateField)
 {
     return table(name,
-                 {{u"DocEntry"_s, u"INTEGER"_s}, {u"DocNum"_s, u"INTEGER"_s}, {cardField, kCode}, {nameField, kText},
-                  {dateField, u"DATE"_s}, {u"CntctCode"_s, u"INTEGER"_s}, {u"Address"_s, u"VARCHAR(254)"_s}},
+                 {{u"DocEntry"_s, u"INTEGER"_s},
+                  {u"DocNum"_s, u"INTEGER"_s},
+                  {cardField, kCode},
+                  {nameField, kText},
+                  {dateField, u"DATE"_s},
+                  {u"CntctCode"_s, u"INTEGER"_s},
+                  {u"Address"_s, u"VARCHAR(254)"_s}},
                  u"DocEntry"_s, {cardField, dateField});
 }
 
@@ -72,15 +97,31 @@ QList<TableSchema> buildCompanyTables()
               u"Code, Country"_s),
         table(u"OCRD"_s, cardColumns(), u"CardCode"_s, {u"CardName"_s, u"CardType, GroupCode"_s}),
         table(u"OCPR"_s,
-              {{u"CntctCode"_s, u"INTEGER"_s}, {u"CardCode"_s, kCode}, {u"Name"_s, kText}, {u"Position"_s, kText},
-               {u"Address"_s, u"VARCHAR(254)"_s}, {u"Tel1"_s, kShort}, {u"Tel2"_s, kShort}, {u"Cellolar"_s, kShort},
-               {u"Fax"_s, kShort}, {u"E_MailL"_s, kText}, {u"Pager"_s, kShort}, {u"Notes1"_s, kText},
+              {{u"CntctCode"_s, u"INTEGER"_s},
+               {u"CardCode"_s, kCode},
+               {u"Name"_s, kText},
+               {u"Position"_s, kText},
+               {u"Address"_s, u"VARCHAR(254)"_s},
+               {u"Tel1"_s, kShort},
+               {u"Tel2"_s, kShort},
+               {u"Cellolar"_s, kShort},
+               {u"Fax"_s, kShort},
+               {u"E_MailL"_s, kText},
+               {u"Pager"_s, kShort},
+               {u"Notes1"_s, kText},
                {u"Notes2"_s, kText}},
               u"CntctCode"_s, {u"CardCode, Name"_s}),
         table(u"CRD1"_s,
-              {{u"CardCode"_s, kCode}, {u"Address"_s, kText}, {u"AdresType"_s, kFlag}, {u"Street"_s, kText},
-               {u"Block"_s, kText}, {u"City"_s, kText}, {u"ZipCode"_s, kShort}, {u"County"_s, kText},
-               {u"State"_s, u"VARCHAR(3)"_s}, {u"Country"_s, u"VARCHAR(3)"_s}},
+              {{u"CardCode"_s, kCode},
+               {u"Address"_s, kText},
+               {u"AdresType"_s, kFlag},
+               {u"Street"_s, kText},
+               {u"Block"_s, kText},
+               {u"City"_s, kText},
+               {u"ZipCode"_s, kShort},
+               {u"County"_s, kText},
+               {u"State"_s, u"VARCHAR(3)"_s},
+               {u"Country"_s, u"VARCHAR(3)"_s}},
               u"CardCode, Address, AdresType"_s),
     };
     for (const char16_t* name : {u"OINV", u"ORIN", u"ODLN", u"OPOR", u"OQUT", u"ORCT", u"OVPM"})
@@ -101,8 +142,8 @@ const QList<TableSchema>& companyTables()
 
 const TableSchema& companyRegistryTable()
 {
-    static const TableSchema registry =
-        table(u"SRGC"_s, {{u"dbName"_s, kText}, {u"cmpName"_s, kText}, {u"versStr"_s, kShort}}, u"dbName"_s);
+    static const TableSchema registry
+        = table(u"SRGC"_s, {{u"dbName"_s, kText}, {u"cmpName"_s, kText}, {u"versStr"_s, kShort}}, u"dbName"_s);
     return registry;
 }
 
@@ -122,7 +163,7 @@ QStringList createStatements(const QList<TableSchema>& tables)
     QStringList statements;
     for (const TableSchema& schema : tables)
         statements << u"CREATE TABLE %1 (%2, PRIMARY KEY (%3))"_s.arg(schema.name, schema.definitions.join(u", "_s),
-                                                                       schema.primaryKey);
+                                                                      schema.primaryKey);
     return statements;
 }
 

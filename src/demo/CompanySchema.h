@@ -11,10 +11,10 @@ namespace pelmar {
 // embedded engine. Names are unquoted, so each engine folds them its own way.
 struct TableSchema {
     QString name;
-    QStringList columns;      // in insert order
+    QStringList columns;  // in insert order
     QStringList definitions;  // "Name TYPE", same order
-    QString primaryKey;       // "Col" or "Col1, Col2"
-    QStringList indexes;      // "CREATE INDEX ..." statements
+    QString primaryKey;  // "Col" or "Col1, Col2"
+    QStringList indexes;  // "CREATE INDEX ..." statements
 };
 
 // The company tables, in an order in which they can be filled.

@@ -21,7 +21,8 @@ constexpr std::uint64_t kDemoSeed = 2026;
 // True when the settings name a company other than the demo in that folder (or the default).
 bool otherCompanyConfigured(const SettingsStore& store, const QString& folder)
 {
-    const QString database = store.value(kPelmarApp, kParamsSection, u"ConnDataBase"_s, QString::fromUtf16(kUnconfiguredDatabase));
+    const QString database
+        = store.value(kPelmarApp, kParamsSection, u"ConnDataBase"_s, QString::fromUtf16(kUnconfiguredDatabase));
     const QString server = store.value(kPelmarApp, kParamsSection, u"ConnServer"_s, u"server"_s);
     const bool unconfigured = database == QString::fromUtf16(kUnconfiguredDatabase);
     const bool demo = database == kDemoDatabase && server == u"sqlite:"_s + folder;

@@ -10,9 +10,9 @@ class SettingsStore;
 QString embeddedCompaniesFolder();
 
 struct DemoResult {
-    QString folder;          // where "demo.sqlite" and "sbo-common.sqlite" were written
-    bool settingsChanged;    // the connection settings now point at the demo company
-    QString message;         // what happened, for the user
+    QString folder;  // where "demo.sqlite" and "sbo-common.sqlite" were written
+    bool settingsChanged;  // the connection settings now point at the demo company
+    QString message;  // what happened, for the user
 };
 
 // Creates the embedded company "demo" (a few hundred cards of the newer schema, listed in

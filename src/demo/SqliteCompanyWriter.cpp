@@ -57,7 +57,8 @@ void SqliteCompanyWriter::add(const TableSchema& table, const QVariantList& valu
     QSqlQuery& insert = insertFor(table);
     for (int i = 0; i < values.size(); ++i) {
         const QVariant& value = values.at(i);
-        insert.bindValue(i, value.typeId() == QMetaType::QDate ? QVariant(value.toDate().toString(Qt::ISODate)) : value);
+        insert.bindValue(i,
+                         value.typeId() == QMetaType::QDate ? QVariant(value.toDate().toString(Qt::ISODate)) : value);
     }
     if (!insert.exec())
         throw failureOf(insert.lastError());

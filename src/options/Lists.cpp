@@ -6,8 +6,8 @@ namespace pelmar {
 
 const QStringList& outputTypeEntries()
 {
-    static const QStringList entries = {u"מדבקות למעטפות"_s, u"מכתבים בפקס"_s, u"דואר אלקטרוני"_s,
-                                        u"לטלפונים סלולריים"_s, u"הדפסת מכתבים"_s};
+    static const QStringList entries
+        = {u"מדבקות למעטפות"_s, u"מכתבים בפקס"_s, u"דואר אלקטרוני"_s, u"לטלפונים סלולריים"_s, u"הדפסת מכתבים"_s};
     return entries;
 }
 
@@ -19,16 +19,16 @@ const QStringList& cardTypeEntries()
 
 const QStringList& phoneTypeEntries()
 {
-    static const QStringList entries = {u"טלפון 1"_s, u"טלפון 2"_s, u"טלפון נייד"_s, u"פקס"_s,
-                                        u"טלפון נייד - איש קשר"_s};
+    static const QStringList entries
+        = {u"טלפון 1"_s, u"טלפון 2"_s, u"טלפון נייד"_s, u"פקס"_s, u"טלפון נייד - איש קשר"_s};
     return entries;
 }
 
 const QStringList& documentTypeEntries()
 {
-    static const QStringList entries = {u"חשבוניות מס"_s, u"חש. מס זיכוי"_s, u"תעודות משלוח"_s,
-                                        u"הזמנות רכש"_s,  u"הצעות מחיר"_s,   u"קבלות"_s,
-                                        u"שיקים"_s,       u"תש. לספקים"_s,   u"תשלומי אשראי"_s};
+    static const QStringList entries
+        = {u"חשבוניות מס"_s, u"חש. מס זיכוי"_s, u"תעודות משלוח"_s, u"הזמנות רכש"_s,  u"הצעות מחיר"_s,
+           u"קבלות"_s,       u"שיקים"_s,        u"תש. לספקים"_s,   u"תשלומי אשראי"_s};
     return entries;
 }
 
@@ -40,8 +40,8 @@ const QStringList& byDocumentEntries()
 
 const QStringList& sortByEntries()
 {
-    static const QStringList entries = {u"מפתח לקוח"_s, u"שם לקוח"_s, u"עיר"_s, u"מיקוד"_s, u"איש קשר ומיקוד"_s,
-                                        u"טלפון סלולרי"_s};
+    static const QStringList entries
+        = {u"מפתח לקוח"_s, u"שם לקוח"_s, u"עיר"_s, u"מיקוד"_s, u"איש קשר ומיקוד"_s, u"טלפון סלולרי"_s};
     return entries;
 }
 

@@ -8,12 +8,12 @@ namespace pelmar {
 
 // The fixed entries of the pages' drop-down lists, in list order. An option of MailingOptions
 // holds a position in one of them; the pages show them.
-const QStringList& outputTypeEntries();     // cmbOutType: position + 2 is the output kind
-const QStringList& cardTypeEntries();       // cmbCS
-const QStringList& phoneTypeEntries();      // cmbPhoneType
-const QStringList& documentTypeEntries();   // CmbDocType
-const QStringList& byDocumentEntries();     // cmbByDoc
-const QStringList& sortByEntries();         // CmbSortBy
+const QStringList& outputTypeEntries();  // cmbOutType: position + 2 is the output kind
+const QStringList& cardTypeEntries();  // cmbCS
+const QStringList& phoneTypeEntries();  // cmbPhoneType
+const QStringList& documentTypeEntries();  // CmbDocType
+const QStringList& byDocumentEntries();  // cmbByDoc
+const QStringList& sortByEntries();  // CmbSortBy
 const QStringList& sortDirectionEntries();  // CmbSortDir
 const QStringList& labelTemplateEntries();  // cmbLabFormat
 const QStringList& addressSourceEntries();  // cmbAddressFrom

@@ -24,7 +24,7 @@ struct MailingOptions {
 
     // Criteria page: which cards the run reaches.
     bool catCode = false;  // ChkCatCode: card type and the chosen groups
-    int cardType = 0;      // cmbCS: customers, suppliers, leads
+    int cardType = 0;  // cmbCS: customers, suppliers, leads
     bool codeRange = false;
     QString fromCard;
     QString toCard;
@@ -34,13 +34,13 @@ struct MailingOptions {
     int phoneType = 0;  // cmbPhoneType: the phone column searched
     QString phonePrefix;
     bool agent = false;
-    int agentIndex = -1;          // CmbAgent: a position in agents
+    int agentIndex = -1;  // CmbAgent: a position in agents
     QList<SalesEmployee> agents;  // CmbAgent's entries, read from the database; never stored
-    bool dates = false;           // the documents criterion
+    bool dates = false;  // the documents criterion
     QString fromDate = QStringLiteral("01/01/1980");
     QString toDate = QStringLiteral("01/01/2025");
     int docType = 0;  // CmbDocType
-    int byDoc = 0;    // cmbByDoc: 0 cards that have such documents, 1 cards that have none
+    int byDoc = 0;  // cmbByDoc: 0 cards that have such documents, 1 cards that have none
     QString fromDocNum;
     QString toDocNum;
     bool items = false;
@@ -54,25 +54,25 @@ struct MailingOptions {
     int sortDir = 0;  // 0 ascending, 1 descending
 
     // Label page: what a label holds and how the sheet is laid out.
-    std::array<bool, 13> useTitle{};             // ChkTitle: which label lines are printed
-    QString deptTag = QStringLiteral("0");       // LblDept's tag: "1" position, else department
-    bool showAttn = true;                        // the attention word before the contact
+    std::array<bool, 13> useTitle{};  // ChkTitle: which label lines are printed
+    QString deptTag = QStringLiteral("0");  // LblDept's tag: "1" position, else department
+    bool showAttn = true;  // the attention word before the contact
     bool deptNewLine = false;
-    QString rows = QStringLiteral("8");          // layout boxes hold what the user typed;
-    QString cols = QStringLiteral("3");          // a run reads them as numbers
+    QString rows = QStringLiteral("8");  // layout boxes hold what the user typed;
+    QString cols = QStringLiteral("3");  // a run reads them as numbers
     QString copies = QStringLiteral("1");
     QString startFrom = QStringLiteral("1");
-    int labFormat = 0;    // cmbLabFormat: 0 standard, 1 contact above the company
+    int labFormat = 0;  // cmbLabFormat: 0 standard, 1 contact above the company
     int addressFrom = 2;  // cmbAddressFrom: 0 mailing, 1 card, 2 document address
-    bool allContacts = false;        // one item per contact person
+    bool allContacts = false;  // one item per contact person
     bool useContactAddress = false;  // prefer the contact's own address (with allContacts)
     bool addressBySql = false;
     QString sqlAddress;
 
     // Letters page.
     QString faxFile = QStringLiteral("c:\\mivtza1.doc");  // the Word template
-    std::array<bool, 8> faxField{};                       // which merge rows are filled
-    std::array<QString, 8> faxExpr{};                     // the free rows' SQL expressions (rows 4..7)
+    std::array<bool, 8> faxField{};  // which merge rows are filled
+    std::array<QString, 8> faxExpr{};  // the free rows' SQL expressions (rows 4..7)
     int faxTransport = 1;  // OptOLE: 1 WinFax, 2 the fax service, 0 neither chosen
     QString faxSubject = QStringLiteral("מבצע השבוע");
     QString faxDelay = QStringLiteral("5");

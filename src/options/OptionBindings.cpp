@@ -51,9 +51,15 @@ OptionBinding flagOption(const char16_t* control, const char16_t* key, FlagField
 OptionBinding listOption(const char16_t* control, const char16_t* key, NumberField field,
                          const QStringList& (*entries)())
 {
-    OptionBinding binding{QString::fromUtf16(control), QString::fromUtf16(key), OptionKind::ListIndex,
-                          {}, [field](MailingOptions& o) -> int& { return o.*field; }, {}, 0,
-                          [entries](const MailingOptions&) { return static_cast<int>(entries().size()); }, {}};
+    OptionBinding binding{QString::fromUtf16(control),
+                          QString::fromUtf16(key),
+                          OptionKind::ListIndex,
+                          {},
+                          [field](MailingOptions& o) -> int& { return o.*field; },
+                          {},
+                          0,
+                          [entries](const MailingOptions&) { return static_cast<int>(entries().size()); },
+                          {}};
     binding.fallback = QString::number(MailingOptions{}.*field);
     return binding;
 }
@@ -62,15 +68,22 @@ OptionBinding listOption(const char16_t* control, const char16_t* key, NumberFie
 // chosen there; the key's own default is the first entry.
 OptionBinding agentOption()
 {
-    return {u"CmbAgent"_s, u"Agent"_s, OptionKind::ListIndex, {},
-            [](MailingOptions& o) -> int& { return o.agentIndex; }, {}, 0,
-            [](const MailingOptions& o) { return static_cast<int>(o.agents.size()); }, u"0"_s};
+    return {u"CmbAgent"_s,
+            u"Agent"_s,
+            OptionKind::ListIndex,
+            {},
+            [](MailingOptions& o) -> int& { return o.agentIndex; },
+            {},
+            0,
+            [](const MailingOptions& o) { return static_cast<int>(o.agents.size()); },
+            u"0"_s};
 }
 
 OptionBinding choiceOption(const QString& control, const QString& key, NumberField group, int choice)
 {
-    OptionBinding binding{control, key, OptionKind::Choice, {}, [group](MailingOptions& o) -> int& { return o.*group; },
-                          {}, choice, {}, {}};
+    OptionBinding binding{
+        control, key, OptionKind::Choice, {}, [group](MailingOptions& o) -> int& { return o.*group; }, {}, choice,
+        {},      {}};
     binding.fallback = MailingOptions{}.*group == choice ? u"True"_s : u"False"_s;
     return binding;
 }
@@ -96,12 +109,14 @@ void addStoredOptions(QList<OptionBinding>& all)
         << textOption(u"txtSQLWhere", u"SQLWhere", &MailingOptions::sqlWhereText)
         << flagOption(u"ChkAddressBySQL", u"AddressBySQL", &MailingOptions::addressBySql)
         << textOption(u"txtSQLAddress", u"SQLAddress", &MailingOptions::sqlAddress)
-        << textOption(u"txtRows", u"Rows", &MailingOptions::rows) << textOption(u"txtCols", u"Cols", &MailingOptions::cols)
+        << textOption(u"txtRows", u"Rows", &MailingOptions::rows)
+        << textOption(u"txtCols", u"Cols", &MailingOptions::cols)
         << textOption(u"txtCopies", u"Copies", &MailingOptions::copies)
         << listOption(u"CmbSortBy", u"SortBy", &MailingOptions::sortBy, &sortByEntries)
         << listOption(u"CmbSortDir", u"SortDir", &MailingOptions::sortDir, &sortDirectionEntries)
         << listOption(u"cmbByDoc", u"ByDoc", &MailingOptions::byDoc, &byDocumentEntries)
-        << textOption(u"LblDept"_s, u"DeptField"_s, [](MailingOptions& o) -> QString& { return o.deptTag; }, OptionKind::Tag)
+        << textOption(
+               u"LblDept"_s, u"DeptField"_s, [](MailingOptions& o) -> QString& { return o.deptTag; }, OptionKind::Tag)
         << flagOption(u"chkShowAttn", u"ShowAttn", &MailingOptions::showAttn);
     for (int i = 0; i < 13; ++i)
         all << flagOption(arrayControl(u"ChkTitle", i), u"UseTitle"_s + QString::number(i),

@@ -14,11 +14,11 @@ class SettingsStore;
 // How an option's value reads as text: in the settings store, on the command line (--set) and
 // for the page control that shows it.
 enum class OptionKind {
-    Text,       // a text box: the text as it stands
+    Text,  // a text box: the text as it stands
     ListIndex,  // a drop-down list: the position in decimal, "-1" for nothing chosen
-    Check,      // a check box: "0" or "1"
-    Choice,     // one option button of a group: "True" or "False"
-    Tag,        // a label's tag: the text as it stands
+    Check,  // a check box: "0" or "1"
+    Choice,  // one option button of a group: "True" or "False"
+    Tag,  // a label's tag: the text as it stands
 };
 
 // One option: the page control that shows it (its objectName, "<name>_<index>" for a member of
@@ -29,9 +29,9 @@ struct OptionBinding {
     QString key;
     OptionKind kind;
     std::function<QString&(MailingOptions&)> text;  // Text and Tag
-    std::function<int&(MailingOptions&)> number;    // ListIndex; Choice: the group's field
-    std::function<bool&(MailingOptions&)> flag;     // Check
-    int choice = 0;                                 // Choice: the value this button stands for
+    std::function<int&(MailingOptions&)> number;  // ListIndex; Choice: the group's field
+    std::function<bool&(MailingOptions&)> flag;  // Check
+    int choice = 0;  // Choice: the value this button stands for
     std::function<int(const MailingOptions&)> entries;  // ListIndex: how many entries the list has
     QString fallback;  // the text a missing key loads: the value of a fresh MailingOptions
 };

@@ -17,14 +17,12 @@ void ignoringFailure(Step step)
 {
     try {
         step();
-    } catch (const std::exception&) {
-    }
+    } catch (const std::exception&) {}
 }
 
 }  // namespace
 
-void initialiseSession(SettingsStore& store, const DatabaseClient& client, SessionState& state,
-                       MailingOptions& options)
+void initialiseSession(SettingsStore& store, const DatabaseClient& client, SessionState& state, MailingOptions& options)
 {
     ignoringFailure([&] { LoadConnSettings(store, state); });
     ignoringFailure([&] { InitLog(); });

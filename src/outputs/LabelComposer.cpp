@@ -15,9 +15,9 @@ constexpr std::array<int, 13> kContactFirstOrder = {0, 11, 3, 12, 1, 2, 6, 4, 7,
 constexpr int kDepartmentLine = 6;
 constexpr qsizetype kLineWidth = 30;
 
-const char16_t* const kColumnNames[] = {u"CardCode", u"CardName", u"MailAddres", u"MailCity", u"MailZipCod", u"Attn",
-                                        u"Department", u"CntctAddrs", u"MailBlock", u"MailCounty", u"MailState",
-                                        u"MailCountry"};
+const char16_t* const kColumnNames[]
+    = {u"CardCode",   u"CardName",   u"MailAddres", u"MailCity",   u"MailZipCod", u"Attn",
+       u"Department", u"CntctAddrs", u"MailBlock",  u"MailCounty", u"MailState",  u"MailCountry"};
 
 // Blanks (spaces) off both ends, as the database values are trimmed.
 QStringView trimmed(QStringView text)
@@ -53,7 +53,8 @@ struct LabelLine {
 
 bool IsHebrew(QStringView text)
 {
-    return std::any_of(text.begin(), text.end(), [](QChar c) { return c.unicode() >= 0x05D0 && c.unicode() <= 0x05EA; });
+    return std::any_of(text.begin(), text.end(),
+                       [](QChar c) { return c.unicode() >= 0x05D0 && c.unicode() <= 0x05EA; });
 }
 
 LabelComposer::LabelComposer(const MailingOptions& options, const LabelDefTable& styles, const Recordset& rows)
@@ -83,8 +84,8 @@ void LabelComposer::write(TextFileWriter& file) const
     for (int column = 0; column < ColumnCount; ++column)
         v[column] = text(static_cast<Column>(column));
 
-    const int directionColumn = columns_[MailAddres] >= 0 && !rows_.valueAt(columns_[MailAddres]).isNull() ? MailAddres
-                                                                                                           : MailCity;
+    const int directionColumn
+        = columns_[MailAddres] >= 0 && !rows_.valueAt(columns_[MailAddres]).isNull() ? MailAddres : MailCity;
     const bool hebrew = IsHebrew(v[directionColumn]);
 
     std::array<LabelLine, 13> lines;

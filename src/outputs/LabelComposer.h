@@ -23,8 +23,21 @@ public:
     void write(TextFileWriter& file) const;
 
 private:
-    enum Column { CardCode, CardName, MailAddres, MailCity, MailZipCod, Attn, Department, CntctAddrs,
-                  MailBlock, MailCounty, MailState, MailCountry, ColumnCount };
+    enum Column {
+        CardCode,
+        CardName,
+        MailAddres,
+        MailCity,
+        MailZipCod,
+        Attn,
+        Department,
+        CntctAddrs,
+        MailBlock,
+        MailCounty,
+        MailState,
+        MailCountry,
+        ColumnCount
+    };
 
     QString text(Column column) const;
 

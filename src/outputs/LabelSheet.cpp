@@ -2,9 +2,9 @@
 
 #include "common/Failure.h"
 #include "common/Fields.h"
+#include "common/TextFileWriter.h"
 #include "db/DatabaseClient.h"
 #include "options/MailingOptions.h"
-#include "common/TextFileWriter.h"
 #include "outputs/LabelComposer.h"
 #include "outputs/RunParameters.h"
 
@@ -18,7 +18,8 @@ namespace {
 
 constexpr int kMaxShort = 32767;
 
-void writeHead(TextFileWriter& file, const LabelLayout& layout, const MailingOptions& options, const LabelDefTable& styles)
+void writeHead(TextFileWriter& file, const LabelLayout& layout, const MailingOptions& options,
+               const LabelDefTable& styles)
 {
     file.line(u"<HTML>"_s);
     file.line(u"<HEAD>"_s);
@@ -59,11 +60,10 @@ qint64 countRecipients(Recordset& rows, const LabelQueries& queries)
 // The labels, page by page and cell by cell; each recipient takes copies consecutive cells.
 class CellWriter {
 public:
-    CellWriter(TextFileWriter& file, const LabelLayout& layout, const LabelQueries& queries, const LabelComposer& composer,
-               Recordset& rows)
+    CellWriter(TextFileWriter& file, const LabelLayout& layout, const LabelQueries& queries,
+               const LabelComposer& composer, Recordset& rows)
         : file_(file), layout_(layout), queries_(queries), composer_(composer), rows_(rows)
-    {
-    }
+    {}
 
     void page(qint64 number)
     {
@@ -112,7 +112,9 @@ LabelLayout LabelLayout::read(const MailingOptions& options)
     layout.rows = wholeNumberIn(options.rows, u"שורות"_s, 1, kMaxShort);
     layout.start = wholeNumberIn(options.startFrom, u"התחל ממדבקה"_s, -kMaxShort - 1, kMaxShort);
     if (layout.rows * layout.cols > kMaxShort)
-        throw Failure(u"דף של %1 שורות ו-%2 עמודות גדול מדי: מותרות עד %3 מדבקות בדף."_s.arg(layout.rows).arg(layout.cols).arg(kMaxShort),
+        throw Failure(u"דף של %1 שורות ו-%2 עמודות גדול מדי: מותרות עד %3 מדבקות בדף."_s.arg(layout.rows)
+                          .arg(layout.cols)
+                          .arg(kMaxShort),
                       6);
     layout.copies = wholeNumberIn(options.copies, u"עותקים"_s, 0, 255);
     return layout;

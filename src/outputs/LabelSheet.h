@@ -29,7 +29,7 @@ struct LabelQueries {
     const DatabaseClient& client;
     QString connString;
     QString counting;  // kind 1 with details, no order
-    QString labels;    // kind 2 with details and the order
+    QString labels;  // kind 2 with details and the order
     // The selection filter: null when off, else true for the codes the list holds.
     std::function<bool(const QString&)> wanted;
 };

@@ -46,7 +46,8 @@ void save(SettingsStore& store, const QString& section, int line, const LabelDef
 void load(const SettingsStore& store, const QString& section, int line, LabelDefRec& def)
 {
     for (const Field& field : kFields) {
-        const QString text = store.value(kPelmarApp, section, QString::fromUtf16(field.key), QString::number(field.fallback));
+        const QString text
+            = store.value(kPelmarApp, section, QString::fromUtf16(field.key), QString::number(field.fallback));
         if (const auto value = byteValue(text))
             def.*field.member = *value;
     }
@@ -98,9 +99,9 @@ void SetGetLabelDefs(unsigned char action, SettingsStore& store, LabelDefTable& 
 QStringList labelStyleRules(int line, const LabelDefRec& style)
 {
     const QString body = u" {font-family:"_s + fontName(style.Font) + u"; font-weight:"_s + weightName(style.FontWeight)
-                         + u"; font-size:"_s + QString::number(style.FontSize) + u"pt; font-style:"_s
-                         + (style.FontItalic == 1 ? u"Italic"_s : u"Normal"_s)
-                         + (style.FontUL == 1 ? u"; text-decoration: underline"_s : QString());
+        + u"; font-size:"_s + QString::number(style.FontSize) + u"pt; font-style:"_s
+        + (style.FontItalic == 1 ? u"Italic"_s : u"Normal"_s)
+        + (style.FontUL == 1 ? u"; text-decoration: underline"_s : QString());
     const QString number = QString::number(line);
     return {u" .L"_s + number + body + u"; text-align: right; direction: rtl; color:black;}"_s,
             u" .LE"_s + number + body + u"; text-align: left; direction: ltr; color:black;}"_s};

@@ -51,8 +51,8 @@ void CreateSMSFile(const QString& pFileName, RunContext& context)
 
 void SaveSMSList(RunContext& context)
 {
-    const QString path =
-        context.services.files.saveFile(u"Text Files (*.txt)|*.txt|All Files (*.*)|*.*"_s, 1, u"smslist"_s);
+    const QString path
+        = context.services.files.saveFile(u"Text Files (*.txt)|*.txt|All Files (*.*)|*.*"_s, 1, u"smslist"_s);
     if (path.isEmpty())
         throw Failure(u"בחירת הקובץ בוטלה; רשימת הטלפונים לא נכתבה."_s, 32755);
     CreateSMSFile(path, context);

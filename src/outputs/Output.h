@@ -61,7 +61,7 @@ struct CommandLineUse {
     enum class Argument { None, CardCode, Kind };
 
     QString synopsis;  // "list [--kind 2..6] [-o FILE] [--open]"
-    QString summary;   // one line for --help
+    QString summary;  // one line for --help
     Argument argument = Argument::None;
     bool fileRequired = false;  // -o FILE must be given: the output asks for its file
 };

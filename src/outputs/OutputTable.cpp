@@ -92,8 +92,8 @@ public:
     CommandLineUse commandLine() const override { return {}; }
     void run(RunContext& context) const override
     {
-        context.services.messages.information(u"הודעה"_s, u"הפלט \"%1\" עדיין אינו זמין בגרסה זו. לא בוצע דבר."_s.arg(
-                                                                outputTypeEntries().at(kind_ - 2)));
+        context.services.messages.information(
+            u"הודעה"_s, u"הפלט \"%1\" עדיין אינו זמין בגרסה זו. לא בוצע דבר."_s.arg(outputTypeEntries().at(kind_ - 2)));
     }
 
 private:

@@ -1,8 +1,8 @@
 #include "outputs/RecipientList.h"
 
 #include "common/Fields.h"
-#include "db/DatabaseClient.h"
 #include "common/TextFileWriter.h"
+#include "db/DatabaseClient.h"
 
 #include <QList>
 
@@ -48,12 +48,13 @@ ListKind kindOf(short kind)
 
 void writeHead(TextFileWriter& file, const ListKind& kind, const QDate& today)
 {
-    for (const char16_t* line : {u"<HTML>", u"<HEAD>", u"<TITLE>טרבל מערכות מידע מציגה</TITLE>",
-                                 u"<meta http-equiv='Content-Type' content='text/html; charset=windows-1255'>",
-                                 u"<style>.MyClass1{font-size : 10pt; color: blue; font-family: Arial}",
-                                 u"       .Title1 {font-size : 12pt; color: blue; font-family: Arial; font-weight : bold; direction: rtl}",
-                                 u"       TD {font-size : 9pt; color: black; font-family: Arial}", u"</style>", u"</HEAD>",
-                                 u"<BODY class=MyClass1 BGCOLOR='#FFFFFF' TEXT='#000000' LINK='#0000FF' VLINK='#800080'>"})
+    for (const char16_t* line :
+         {u"<HTML>", u"<HEAD>", u"<TITLE>טרבל מערכות מידע מציגה</TITLE>",
+          u"<meta http-equiv='Content-Type' content='text/html; charset=windows-1255'>",
+          u"<style>.MyClass1{font-size : 10pt; color: blue; font-family: Arial}",
+          u"       .Title1 {font-size : 12pt; color: blue; font-family: Arial; font-weight : bold; direction: rtl}",
+          u"       TD {font-size : 9pt; color: black; font-family: Arial}", u"</style>", u"</HEAD>",
+          u"<BODY class=MyClass1 BGCOLOR='#FFFFFF' TEXT='#000000' LINK='#0000FF' VLINK='#800080'>"})
         file.line(line);
     file.line(u"<p class=Title1 align='left'>"_s + today.toString(u"dd/MM/yyyy"_s) + u"</p>"_s);
     file.line(u"<p class=Title1 align='right'>נובר-דיוור ל-SAP Business One</p>");
@@ -132,9 +133,10 @@ void writeRecipientList(const QString& path, short kind, const ListQuery& query,
     file.line(u"<hr noshade width='100%' size='2'>");
     file.line(u"<p class=Title1 align='right'>מספר הכרטיסים ברשימה: "_s + QString::number(count) + u"</p>"_s);
     if (kind == 2 && pages)
-        file.line(u"<p class=Title1 align='right'>מספר הדפים הנדרשים: "_s + QString::number(labelPagesNeeded(count, *pages))
-                  + u"</p>"_s);
-    for (const char16_t* line : {u"<br>", u"<p class=Title1 align='center'>טרבל מערכות מידע</p>", u"</BODY>", u"</HTML>"})
+        file.line(u"<p class=Title1 align='right'>מספר הדפים הנדרשים: "_s
+                  + QString::number(labelPagesNeeded(count, *pages)) + u"</p>"_s);
+    for (const char16_t* line :
+         {u"<br>", u"<p class=Title1 align='center'>טרבל מערכות מידע</p>", u"</BODY>", u"</HTML>"})
         file.line(line);
     file.close();
 }

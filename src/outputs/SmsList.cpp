@@ -1,8 +1,8 @@
 #include "outputs/SmsList.h"
 
 #include "common/Fields.h"
-#include "db/DatabaseClient.h"
 #include "common/TextFileWriter.h"
+#include "db/DatabaseClient.h"
 
 using namespace Qt::StringLiterals;
 

@@ -6,8 +6,7 @@ namespace pelmar {
 
 CheckListModel::CheckListModel(QStringList headers, QList<int> columns, QObject* parent)
     : QAbstractTableModel(parent), headers_(std::move(headers)), columns_(std::move(columns))
-{
-}
+{}
 
 int CheckListModel::rowCount(const QModelIndex& parent) const
 {

@@ -46,7 +46,8 @@ void readCardGroups(const DatabaseClient& client, const QString& connString, sho
         statement += u" WHERE GroupType='"_s + CardTypeCode(cardType, true) + u"'"_s;
     statement += u" ORDER BY GroupType, GroupCode"_s;
     for (auto groups = client.open(statement, connString); !groups->eof(); groups->moveNext())
-        rows.append({QString::number(groups->value(u"GroupCode"_s).toInt()), {nameOrDash(groups->value(u"GroupName"_s))}});
+        rows.append(
+            {QString::number(groups->value(u"GroupCode"_s).toInt()), {nameOrDash(groups->value(u"GroupName"_s))}});
 }
 
 QVector<CheckListModel::Row> unnamedProperties()
@@ -59,7 +60,8 @@ QVector<CheckListModel::Row> unnamedProperties()
 
 void nameProperties(const DatabaseClient& client, const QString& connString, QVector<CheckListModel::Row>& properties)
 {
-    for (auto names = client.open(u"SELECT * FROM OCQG Order By GroupCode"_s, connString); !names->eof(); names->moveNext()) {
+    for (auto names = client.open(u"SELECT * FROM OCQG Order By GroupCode"_s, connString); !names->eof();
+         names->moveNext()) {
         const int n = names->value(u"GroupCode"_s).toInt();
         if (n >= 1 && n <= 64)
             properties[n - 1].texts = {nameOrDash(names->value(u"GroupName"_s))};

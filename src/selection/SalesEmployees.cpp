@@ -24,8 +24,7 @@ void FillCmbAgent(const DatabaseClient& client, const QString& connString, Maili
         }
         options.agents = employees;
         options.agentIndex = employees.isEmpty() ? -1 : 0;
-    } catch (const Failure&) {
-    }
+    } catch (const Failure&) {}
 }
 
 }  // namespace pelmar

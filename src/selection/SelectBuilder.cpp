@@ -65,22 +65,21 @@ QString addressColumns(const MailingOptions& c, short level, int pDocIndex, bool
         if (!details)
             return u"SELECT DISTINCT OCRD.CardCode, "_s + doc.TableName + u'.' + doc.NameField + u" As CardName"_s;
         return u"SELECT DISTINCT OCRD.CardCode, "_s + doc.TableName + u'.' + doc.NameField + u" As CardName"_s
-               + orDefault(addrSql(c), u", "_s + doc.TableName + u".Address MailAddres"_s)
-               + u", '' MailCounty, '' MailCity, '' MailZipCod"_s + contact + u" As CntctAddrs"_s;
+            + orDefault(addrSql(c), u", "_s + doc.TableName + u".Address MailAddres"_s)
+            + u", '' MailCounty, '' MailCity, '' MailZipCod"_s + contact + u" As CntctAddrs"_s;
     case Source::Card:
         if (!details)
             return u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName"_s;
-        return u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName"_s
-               + orDefault(addrSql(c), u", OCRD.Address MailAddres"_s)
-               + u", OCRD.County MailCounty, OCRD.City MailCity, OCRD.ZipCode MailZipCod"_s + contact
-               + u" As CntctAddrs"_s + nameTableColumns(level, u"OCRD.Block"_s, u"OCRD.Country"_s);
+        return u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName"_s + orDefault(addrSql(c), u", OCRD.Address MailAddres"_s)
+            + u", OCRD.County MailCounty, OCRD.City MailCity, OCRD.ZipCode MailZipCod"_s + contact + u" As CntctAddrs"_s
+            + nameTableColumns(level, u"OCRD.Block"_s, u"OCRD.Country"_s);
     case Source::Mailing:
         if (!details)
             return u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName"_s;
         return u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName"_s + orDefault(addrSql(c), u", OCRD.MailAddres"_s)
-               + u", OCRD.MailCounty, OCRD.MailCity, OCRD.MailZipCod"_s + contact + u" CntctAddrs"_s
-               + (level == 1 ? u", OCRD.MailBlock, OCST.Name MailState, OCRY.Name MailCountry"_s
-                             : nameTableColumns(level, {}, u"OCRD.MailCountr"_s));
+            + u", OCRD.MailCounty, OCRD.MailCity, OCRD.MailZipCod"_s + contact + u" CntctAddrs"_s
+            + (level == 1 ? u", OCRD.MailBlock, OCST.Name MailState, OCRY.Name MailCountry"_s
+                          : nameTableColumns(level, {}, u"OCRD.MailCountr"_s));
     }
     return {};
 }
@@ -90,8 +89,7 @@ QString columnList(const MailingOptions& c, short level, int pDocIndex, bool det
     switch (kind) {
     case kCardList:
     case kLabels:
-    case kLetters:
-        return addressColumns(c, level, pDocIndex, details, kind);
+    case kLetters: return addressColumns(c, level, pDocIndex, details, kind);
     case kFax:
         return u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Fax, OCRD.Phone1, OCPR.Name AS Attn, "
                "OCPR.Name AS CName, OCPR.Fax AS CFax, OCPR.Position, OCPR.Notes1, OCPR.Notes2"_s;
@@ -101,8 +99,7 @@ QString columnList(const MailingOptions& c, short level, int pDocIndex, bool det
     case kMobiles:
         return u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Cellular AS Mobile, OCPR.Name As Attn, "
                "OCPR.Name AS CName, OCPR.Cellolar AS CMobile"_s;
-    default:
-        return {};
+    default: return {};
     }
 }
 
@@ -125,20 +122,20 @@ QString fromClause(const MailingOptions& c, short level, int pDocIndex, bool det
     QString from;
     if (documentJoin(c)) {
         from = u" FROM (OCRD INNER JOIN "_s + t + u" ON OCRD.CardCode = "_s + t + u'.' + doc.CardField + u")"_s
-               + u" LEFT JOIN OCPR ON"_s;
-        from += doc.HasContact ? u" (OCPR.CardCode = "_s + t + u'.' + doc.CardField + u" And OCPR.CntctCode = "_s + t
-                                     + u".CntctCode)"_s
-                               : u" (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn)"_s;
+            + u" LEFT JOIN OCPR ON"_s;
+        from += doc.HasContact
+            ? u" (OCPR.CardCode = "_s + t + u'.' + doc.CardField + u" And OCPR.CntctCode = "_s + t + u".CntctCode)"_s
+            : u" (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn)"_s;
     } else {
         from = u" FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode"_s
-               + (c.allContacts ? QString() : u" AND OCPR.Name = OCRD.CntctPrsn"_s) + u" )"_s;
+            + (c.allContacts ? QString() : u" AND OCPR.Name = OCRD.CntctPrsn"_s) + u" )"_s;
     }
     if (isAddressKind(kind) && details && level == 1) {
         const bool card = c.addressFrom == 1;
         const QString country = card ? u"OCRD.Country"_s : u"OCRD.MailCountr"_s;
         const QString state = card ? u"OCRD.State1"_s : u"OCRD.State2"_s;
         from += u" LEFT JOIN OCRY ON (OCRY.Code = "_s + country + u")"_s + u" LEFT JOIN OCST ON (OCST.Code = "_s + state
-                + u" AND OCST.Country = "_s + country + u")"_s;
+            + u" AND OCST.Country = "_s + country + u")"_s;
     }
     return from;
 }
@@ -262,7 +259,8 @@ QString recipientStatement(const MailingOptions& options, const SessionState& st
                            bool ordered)
 {
     const short level = state.SboVersionLevel;
-    QString statement = BuildSelect(options, level, options.docType, pAllDetails, pOutType) + BuildWhere(options, state);
+    QString statement
+        = BuildSelect(options, level, options.docType, pAllDetails, pOutType) + BuildWhere(options, state);
     if (ordered)
         statement += BuildOrderBy(options, level, options.docType, pOutType);
     return statement;

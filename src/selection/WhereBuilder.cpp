@@ -35,7 +35,7 @@ QString phoneColumn(int phoneType)
     switch (phoneType) {
     case 1: return u"OCRD.Phone2"_s;
     case 2: return u"OCRD.Cellular"_s;  // "טלפון נייד"
-    case 3: return u"OCRD.Fax"_s;       // "פקס"
+    case 3: return u"OCRD.Fax"_s;  // "פקס"
     case 4: return u"OCPR.Cellolar"_s;
     default: return u"OCRD.Phone1"_s;
     }
@@ -69,8 +69,8 @@ QString BuildDatesCriteria(const QDate& pFromDate, const QDate& pToDate, int pDo
 {
     const DocTypeInfo doc = GetDocTypeInfo(pDocIndex);
     const QString& t = doc.TableName;
-    QString condition = t + u'.' + doc.DateField + u" Between '"_s + sqlDate(pFromDate) + u"' And '"_s
-                        + sqlDate(pToDate) + u"'"_s;
+    QString condition
+        = t + u'.' + doc.DateField + u" Between '"_s + sqlDate(pFromDate) + u"' And '"_s + sqlDate(pToDate) + u"'"_s;
     if (!pFromDocNum.isEmpty())
         condition += u" And "_s + t + u".DocNum>="_s + documentNumber(pFromDocNum, u"הראשון"_s);
     if (!pToDocNum.isEmpty())
@@ -79,7 +79,7 @@ QString BuildDatesCriteria(const QDate& pFromDate, const QDate& pToDate, int pDo
         return u" AND "_s + condition;
     if (pDocRelation == 1)
         return u" AND OCRD.CardCode Not In (Select Distinct "_s + doc.CardField + u" From "_s + t + u" Where "_s
-               + condition + u")"_s;
+            + condition + u")"_s;
     return {};
 }
 
@@ -89,9 +89,11 @@ QString BuildItemsCriteria(const QString& pFromItem, const QString& pToItem)
     const QString from = sqlText(pFromItem);
     const QString to = sqlText(pToItem);
     const QString invoices = u"SELECT CardCode FROM OINV, INV1 Where INV1.DocEntry = OINV.DocEntry"
-                             " And INV1.ItemCode Between N'"_s + from + range + to + u"' GROUP BY CardCode"_s;
+                             " And INV1.ItemCode Between N'"_s
+        + from + range + to + u"' GROUP BY CardCode"_s;
     const QString credits = u"SELECT CardCode FROM ORIN, RIN1 Where RIN1.DocEntry = ORIN.DocEntry"
-                            " And RIN1.ItemCode Between N'"_s + from + range + to + u"' GROUP BY CardCode"_s;
+                            " And RIN1.ItemCode Between N'"_s
+        + from + range + to + u"' GROUP BY CardCode"_s;
     return u" AND (OCRD.CardCode IN ("_s + invoices + u") OR OCRD.CardCode IN ("_s + credits + u"))"_s;
 }
 

@@ -18,7 +18,8 @@ QString groupKey(const QString& section, const QString& key)
 
 }  // namespace
 
-SettingsStore::SettingsStore(QString folder) : folder_(std::move(folder)) {}
+SettingsStore::SettingsStore(QString folder) : folder_(std::move(folder))
+{}
 
 SettingsStore SettingsStore::forCurrentUser()
 {
@@ -44,8 +45,7 @@ bool SettingsStore::contains(const QString& app, const QString& section, const Q
     return settings.contains(groupKey(section, key));
 }
 
-void SettingsStore::setValue(const QString& app, const QString& section, const QString& key,
-                             const QString& text)
+void SettingsStore::setValue(const QString& app, const QString& section, const QString& key, const QString& text)
 {
     const QString path = filePath(app);
     createPrivateFile(path);
@@ -65,8 +65,7 @@ void SettingsStore::createPrivateFile(const QString& path) const
     QDir().mkpath(folder_);
     QFile file(path);
     if (!file.open(QIODevice::WriteOnly, QFileDevice::ReadOwner | QFileDevice::WriteOwner))
-        throw Failure(QStringLiteral("Cannot create the settings file %1: %2.")
-                          .arg(path, file.errorString()));
+        throw Failure(QStringLiteral("Cannot create the settings file %1: %2.").arg(path, file.errorString()));
 }
 
 }  // namespace pelmar

@@ -22,12 +22,10 @@ public:
     static SettingsStore forCurrentUser();
 
     // The stored text, or fallback when the key is missing.
-    QString value(const QString& app, const QString& section, const QString& key,
-                  const QString& fallback) const;
+    QString value(const QString& app, const QString& section, const QString& key, const QString& fallback) const;
 
     // Stores the text. Throws Failure when the file cannot be written.
-    void setValue(const QString& app, const QString& section, const QString& key,
-                  const QString& text);
+    void setValue(const QString& app, const QString& section, const QString& key, const QString& text);
 
     bool contains(const QString& app, const QString& section, const QString& key) const;
 

@@ -13,8 +13,8 @@ namespace pelmar {
 
 namespace {
 
-QMessageBox::StandardButton show(QWidget* parent, QMessageBox::Icon icon, const QString& title,
-                                 const QString& text, QMessageBox::StandardButtons buttons)
+QMessageBox::StandardButton show(QWidget* parent, QMessageBox::Icon icon, const QString& title, const QString& text,
+                                 QMessageBox::StandardButtons buttons)
 {
     QMessageBox box(icon, title.isEmpty() ? QApplication::applicationName() : title, text, buttons, parent);
     box.setLayoutDirection(Qt::RightToLeft);

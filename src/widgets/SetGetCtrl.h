@@ -11,7 +11,7 @@ class SettingsStore;
 // Which property of a dialog's control a setting carries. The options of the control's pages go
 // through the binding table instead (options/OptionBindings.h).
 enum CtrlProp : unsigned char {
-    kPropText = 1,   // a text box's text
+    kPropText = 1,  // a text box's text
     kPropValue = 3,  // a check box: "0" or "1"
 };
 

@@ -1,5 +1,5 @@
-#include "common/Windows1255.h"
 #include "common/Failure.h"
+#include "common/Windows1255.h"
 #include "outputs/Runs.h"
 #include "support/LabelCompany.h"
 
@@ -20,19 +20,20 @@ protected:
     }
 };
 
-const QString kHead =
-    u"<HTML>\r\n<!-- saved from url=(0024)http://www.pelmar.co.il/ -->\r\n<HEAD>\r\n<TITLE>כרטיס לקוח/ספק</TITLE>\r\n"
-    "<meta http-equiv='Content-Type' content='text/html; charset=windows-1255'>\r\n<style>\r\n"
-    "  BODY {direction:rtl; background:#FFFFFF ;margin-top:10; margin-left:10; margin-right:10; vertical-align:top;}\r\n"
-    "  TABLE {border: thin solid #ADD6EA}\r\n"
-    "  TD {font-size : 9pt; color: black; font-family: arial; text-align: right}\r\n"
-    "  .TblClean {border: none}\r\n"
-    "  .Cap {background:#5F8EBE; font-size : 9pt; color: white; font-family: Arial; font-weight: bold}\r\n"
-    "  .GCap {font-size : 9pt; color: #5F8EBE; font-family: Arial; font-weight: bold}\r\n"
-    "  .Title1 {font-size : 12pt; color: blue; font-family: arial; font-weight : bold;}\r\n"
-    "  .Tarvel {font-size : 8pt; color: black; font-family: arial;}\r\n</style>\r\n</HEAD>\r\n"
-    "<BODY TEXT='#000000' LINK='#0000FF' VLINK='#800080'>\r\n"
-    "<table class=TblClean width='100%' border='0' cellpadding='3' cellspacing='3'>\r\n"_s;
+const QString kHead
+    = u"<HTML>\r\n<!-- saved from url=(0024)http://www.pelmar.co.il/ -->\r\n<HEAD>\r\n<TITLE>כרטיס לקוח/ספק</TITLE>\r\n"
+      "<meta http-equiv='Content-Type' content='text/html; charset=windows-1255'>\r\n<style>\r\n"
+      "  BODY {direction:rtl; background:#FFFFFF ;margin-top:10; margin-left:10; margin-right:10; "
+      "vertical-align:top;}\r\n"
+      "  TABLE {border: thin solid #ADD6EA}\r\n"
+      "  TD {font-size : 9pt; color: black; font-family: arial; text-align: right}\r\n"
+      "  .TblClean {border: none}\r\n"
+      "  .Cap {background:#5F8EBE; font-size : 9pt; color: white; font-family: Arial; font-weight: bold}\r\n"
+      "  .GCap {font-size : 9pt; color: #5F8EBE; font-family: Arial; font-weight: bold}\r\n"
+      "  .Title1 {font-size : 12pt; color: blue; font-family: arial; font-weight : bold;}\r\n"
+      "  .Tarvel {font-size : 8pt; color: black; font-family: arial;}\r\n</style>\r\n</HEAD>\r\n"
+      "<BODY TEXT='#000000' LINK='#0000FF' VLINK='#800080'>\r\n"
+      "<table class=TblClean width='100%' border='0' cellpadding='3' cellspacing='3'>\r\n"_s;
 
 QString block(const QStringList& captions, const QStringList& values)
 {
@@ -49,9 +50,10 @@ QString block(const QStringList& captions, const QStringList& values)
 
 QString section(const QString& title, const QStringList& captions, const QList<QStringList>& rows)
 {
-    QString text = u"<tr><td class=GCap align=right>"_s + title + u"</td></tr>\r\n<tr><td>\r\n"
-                   " <table width='100%' border='0' cellpadding='2' cellspacing='2'>\r\n"
-                   "  <tr bgcolor='#FFFFFF' align='right'>\r\n"_s;
+    QString text = u"<tr><td class=GCap align=right>"_s + title
+        + u"</td></tr>\r\n<tr><td>\r\n"
+          " <table width='100%' border='0' cellpadding='2' cellspacing='2'>\r\n"
+          "  <tr bgcolor='#FFFFFF' align='right'>\r\n"_s;
     for (const QString& caption : captions)
         text += u"    <td class=Cap>"_s + caption + u"</td>\r\n"_s;
     text += u"  </tr>\r\n"_s;
@@ -66,20 +68,22 @@ QString section(const QString& title, const QStringList& captions, const QList<Q
 
 TEST_F(CardPageTest, ACardOfTheNewerSchemaIsWrittenByteForByte)
 {
-    const QString expected =
-        kHead + u"<tr><td>\r\n <table width='100%' border='0' cellpadding='2' cellspacing='2'>\r\n"_s
+    const QString expected
+        = kHead + u"<tr><td>\r\n <table width='100%' border='0' cellpadding='2' cellspacing='2'>\r\n"_s
         + block({u"קוד כרטיס"_s, u"שם כרטיס"_s, u"סיווג"_s, u"השתייכות"_s},
                 {u"<td><b>C1</b></td>"_s, u"<td><b>אבג בע&quot;מ</b></td>"_s, u"<td>לקוח</td>"_s, u"<td>לקוחות</td>"_s})
         + block({u"טלפון 1"_s, u"טלפון 2"_s, u"טלפון נייד"_s, u"פקס"_s},
                 {u"<td>&nbsp;</td>"_s, u"<td>&nbsp;</td>"_s, u"<td>050-123</td>"_s, u"<td>04-1234567</td>"_s})
         + block({u"שם לועזי"_s, u"עוסק מורשה"_s, u"דואל"_s, u"הערות"_s},
                 {u"<td>&nbsp;</td>"_s, u"<td>&nbsp;</td>"_s, u"<td>info@c1.co.il</td>"_s, u"<td>&nbsp;</td>"_s})
-        + block({u"מאפיינים"_s}, {u"<td>שלוש &amp; &lt;ג&gt;, שבע</td>"_s})
-        + u" </table>\r\n</td></tr>\r\n"_s
-        + section(u"כתובות"_s, {u"סוג"_s, u"רחוב/תא דואר"_s, u"גוש"_s, u"עיר"_s, u"מיקוד"_s, u"מחוז"_s, u"מדינה"_s, u"ארץ"_s},
-                  {{u"ראשית"_s, u"הרצל 1"_s, u"&nbsp;"_s, u"חיפה"_s, u"&nbsp;"_s, u"&nbsp;"_s, u"&nbsp;"_s, u"ישראל"_s}})
-        + section(u"אנשי קשר"_s, {u"שם"_s, u"תפקיד"_s, u"טל. 1"_s, u"טל. 2"_s, u"טל. נייד"_s, u"פקס"_s, u"EMail"_s,
-                                  u"זימונית"_s, u"הערות 1"_s, u"הערות 2"_s},
+        + block({u"מאפיינים"_s}, {u"<td>שלוש &amp; &lt;ג&gt;, שבע</td>"_s}) + u" </table>\r\n</td></tr>\r\n"_s
+        + section(
+              u"כתובות"_s,
+              {u"סוג"_s, u"רחוב/תא דואר"_s, u"גוש"_s, u"עיר"_s, u"מיקוד"_s, u"מחוז"_s, u"מדינה"_s, u"ארץ"_s},
+              {{u"ראשית"_s, u"הרצל 1"_s, u"&nbsp;"_s, u"חיפה"_s, u"&nbsp;"_s, u"&nbsp;"_s, u"&nbsp;"_s, u"ישראל"_s}})
+        + section(u"אנשי קשר"_s,
+                  {u"שם"_s, u"תפקיד"_s, u"טל. 1"_s, u"טל. 2"_s, u"טל. נייד"_s, u"פקס"_s, u"EMail"_s, u"זימונית"_s,
+                   u"הערות 1"_s, u"הערות 2"_s},
                   {{u"משה"_s, u"מנהל"_s, u"04-5555555"_s, u"&nbsp;"_s, u"052-999"_s, u"&nbsp;"_s, u""_s, u"&nbsp;"_s,
                     u"רכש"_s, u"&nbsp;"_s}})
         + u"</table>\r\n<p class=Tarvel align='center'>טרבל מערכות מידע</p>\r\n</BODY>\r\n</HTML>\r\n"_s;
@@ -95,13 +99,15 @@ TEST_F(CardPageTest, TheOlderSchemaShowsTheCardsTwoAddresses)
                                       {{u"כתובת למשלוח"_s, u"12 Main St"_s, u"Springfield"_s, u"&nbsp;"_s, u"&nbsp;"_s,
                                         u"&nbsp;"_s}})))
         << "a mailing address equal to the address is not shown twice";
-    EXPECT_TRUE(page(u"M1"_s, u"older"_s)
-                    .contains(section(u"כתובות"_s, kOlderCaptions,
-                                      {{u"כתובת לדואר"_s, u"ת.ד. 7"_s, u"עכו"_s, u"&nbsp;"_s, u"&nbsp;"_s, u"&nbsp;"_s}})))
+    EXPECT_TRUE(
+        page(u"M1"_s, u"older"_s)
+            .contains(section(u"כתובות"_s, kOlderCaptions,
+                              {{u"כתובת לדואר"_s, u"ת.ד. 7"_s, u"עכו"_s, u"&nbsp;"_s, u"&nbsp;"_s, u"&nbsp;"_s}})))
         << "a mailing address and a Null address show the mailing row only";
     const QString c1 = page(u"C1"_s, u"older"_s);
-    EXPECT_TRUE(c1.contains(u"    <td>כתובת למשלוח</td>\r\n    <td>הרצל 1</td>\r\n    <td>חיפה</td>\r\n    <td>&nbsp;</td>\r\n"
-                            "    <td>&nbsp;</td>\r\n    <td>ישראל</td>\r\n"_s))
+    EXPECT_TRUE(
+        c1.contains(u"    <td>כתובת למשלוח</td>\r\n    <td>הרצל 1</td>\r\n    <td>חיפה</td>\r\n    <td>&nbsp;</td>\r\n"
+                    "    <td>&nbsp;</td>\r\n    <td>ישראל</td>\r\n"_s))
         << "the country is named through OCRY";
 }
 
@@ -127,10 +133,16 @@ TEST_F(CardPageTest, CardTypesAndACodeWithAnApostrophe)
 
 TEST_F(CardPageTest, ASetPropertyWithoutANameStillGivesThePropertiesBlock)
 {
-    engine->createDatabase(u"unnamed"_s, handMadeCompany(900000, {
-        insertRow(u"OCRG"_s, {{u"GroupCode"_s, 100}, {u"GroupName"_s, u"g"_s}}),
-        insertRow(u"OCRD"_s, {{u"CardCode"_s, u"P1"_s}, {u"GroupCode"_s, 100}, {u"QryGroup9"_s, u"Y"_s}})}));
-    EXPECT_TRUE(page(u"P1"_s, u"unnamed"_s).contains(u"     <td class=Cap>מאפיינים</td>\r\n    </tr>\r\n    <tr align='right'>\r\n     <td></td>\r\n"_s));
+    engine->createDatabase(
+        u"unnamed"_s,
+        handMadeCompany(
+            900000,
+            {insertRow(u"OCRG"_s, {{u"GroupCode"_s, 100}, {u"GroupName"_s, u"g"_s}}),
+             insertRow(u"OCRD"_s, {{u"CardCode"_s, u"P1"_s}, {u"GroupCode"_s, 100}, {u"QryGroup9"_s, u"Y"_s}})}));
+    EXPECT_TRUE(
+        page(u"P1"_s, u"unnamed"_s)
+            .contains(
+                u"     <td class=Cap>מאפיינים</td>\r\n    </tr>\r\n    <tr align='right'>\r\n     <td></td>\r\n"_s));
 }
 
 TEST_F(CardPageTest, AnUnreadableSchemaLevelTouchesNoFile)

@@ -21,8 +21,9 @@ protected:
     void SetUp() override
     {
         LabelCompanyTest::SetUp();
-        for (const auto& [key, value] : {std::pair{u"ConnServer"_s, engine->server()}, std::pair{u"ConnUID"_s, engine->user()},
-                                         std::pair{u"ConnPWD"_s, QString()}, std::pair{u"ConnDataBase"_s, u"labels"_s}})
+        for (const auto& [key, value] :
+             {std::pair{u"ConnServer"_s, engine->server()}, std::pair{u"ConnUID"_s, engine->user()},
+              std::pair{u"ConnPWD"_s, QString()}, std::pair{u"ConnDataBase"_s, u"labels"_s}})
             store->setValue(u"Pelmar"_s, u"Params"_s, key, value);
         store->setValue(u"Pelmar"_s, u"Params"_s, u"Rows"_s, u"3"_s);
         store->setValue(u"Pelmar"_s, u"Params"_s, u"UseTitle2"_s, u"1"_s);
@@ -32,7 +33,10 @@ protected:
 
     Result pelmar(const QStringList& arguments) { return runProgram(folder(), arguments); }
 
-    QString setting(const QString& key) { return SettingsStore(configFolder()).value(u"Pelmar"_s, u"Params"_s, key, u"<none>"_s); }
+    QString setting(const QString& key)
+    {
+        return SettingsStore(configFolder()).value(u"Pelmar"_s, u"Params"_s, key, u"<none>"_s);
+    }
 };
 
 TEST_F(CommandLineTest, EachCommandWritesWhatTheWindowsPathWrites)
@@ -87,8 +91,9 @@ TEST_F(CommandLineTest, SqlPrintsTheStatementOfEachKind)
 
 TEST_F(CommandLineTest, SetChangesEachKindOfControlAndSaveStoresIt)
 {
-    const QStringList sets = {u"--set"_s, u"txtRows=12"_s, u"--set"_s, u"cmbLabFormat=1"_s, u"--set"_s, u"ChkTitle_7=1"_s,
-                              u"--set"_s, u"OptOLE_2=true"_s, u"--set"_s, u"LblDept=1"_s};
+    const QStringList sets
+        = {u"--set"_s,        u"txtRows=12"_s, u"--set"_s,         u"cmbLabFormat=1"_s, u"--set"_s,
+           u"ChkTitle_7=1"_s, u"--set"_s,      u"OptOLE_2=true"_s, u"--set"_s,          u"LblDept=1"_s};
     EXPECT_EQ(pelmar(QStringList{u"sql"_s} + sets).exit, 0);
     EXPECT_EQ(setting(u"Rows"_s), u"3"_s) << "nothing is stored without --save";
     EXPECT_EQ(pelmar(QStringList{u"sql"_s, u"--save"_s} + sets).exit, 0);
@@ -108,13 +113,16 @@ TEST_F(CommandLineTest, SetChangesEachKindOfControlAndSaveStoresIt)
 
 TEST_F(CommandLineTest, CardsGroupsAndPropertiesShapeTheRun)
 {
-    writeFile(path(u"cards.txt"_s), "\xEF\xBB\xBF" "C5\r\nC1\r\n");
+    writeFile(path(u"cards.txt"_s),
+              "\xEF\xBB\xBF"
+              "C5\r\nC1\r\n");
     EXPECT_EQ(pelmar({u"sms"_s, u"-o"_s, path(u"n.txt"_s), u"--cards"_s, path(u"cards.txt"_s)}).exit, 0);
     EXPECT_EQ(readFile(path(u"n.txt"_s)), QByteArray("052-999\r\n054 777\r\n"));
     EXPECT_EQ(pelmar({u"sms"_s, u"-o"_s, path(u"n.txt"_s), u"--card"_s, u"C2"_s}).exit, 0);
     EXPECT_EQ(readFile(path(u"n.txt"_s)), QByteArray("050-222\r\n"));
 
-    const QString sql = pelmar({u"sql"_s, u"--groups"_s, u"100,103"_s, u"--properties"_s, u"3,17"_s, u"--relation"_s, u"or"_s}).out;
+    const QString sql
+        = pelmar({u"sql"_s, u"--groups"_s, u"100,103"_s, u"--properties"_s, u"3,17"_s, u"--relation"_s, u"or"_s}).out;
     EXPECT_TRUE(sql.contains(u" AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s)) << sql.toStdString();
     EXPECT_TRUE(sql.contains(u" And (OCRD.QryGroup3='Y' OR OCRD.QryGroup17='Y')"_s));
 }

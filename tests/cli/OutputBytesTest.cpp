@@ -6,8 +6,8 @@
 //   PELMAR_RECORD_DIGESTS=$PWD/tests/data/output-digests.txt build/tests/test_cli --gtest_filter='OutputBytes*'
 
 #include "cli/Program.h"
-#include "support/LabelCompany.h"
 #include "settings/SettingsStore.h"
+#include "support/LabelCompany.h"
 #include "support/MemoryCompany.h"
 
 #include <QCryptographicHash>
@@ -97,8 +97,7 @@ QList<Combination> labelCombinations()
         {u"labels properties and city"_s, u"gen1"_s,
          QStringList{u"labels"_s} + allLines() + sets({u"ChkCity=1"_s, u"TxtCity=ח"_s})
              + QStringList{u"--properties"_s, u"3,7"_s, u"--relation"_s, u"OR"_s}},
-        {u"labels hand-picked"_s, u"gen1"_s,
-         QStringList{u"labels"_s} + allLines() + handPicked()},
+        {u"labels hand-picked"_s, u"gen1"_s, QStringList{u"labels"_s} + allLines() + handPicked()},
         {u"labels mobile descending"_s, u"gen1"_s,
          QStringList{u"labels"_s} + allLines() + sets({u"CmbSortBy=5"_s, u"CmbSortDir=1"_s})},
         {u"labels items and agent"_s, u"gen1"_s,
@@ -124,8 +123,7 @@ QList<Combination> listCombinations()
                                     list + sets({u"cmbAddressFrom=1"_s, u"CmbSortBy=2"_s, u"CmbSortDir=1"_s})}
                      << Combination{name + u"documents every contact"_s, u"gen1"_s,
                                     list + kDocuments + sets({u"ChkAllContact=1"_s, u"CmbSortBy=4"_s})}
-                     << Combination{name + u"hand-picked"_s, u"gen1"_s,
-                                    list + handPicked()}
+                     << Combination{name + u"hand-picked"_s, u"gen1"_s, list + handPicked()}
                      << Combination{name + u"hand-made"_s, u"labels"_s, list};
     }
     combinations << Combination{u"list 2 layout"_s, u"gen1"_s,
@@ -171,11 +169,11 @@ QList<Combination> sqlCombinations()
                                     sql + kDocuments + sets({u"CmbDocType=6"_s, u"CmbSortBy=1"_s})}
                      << Combination{u"sql %1 every criterion"_s.arg(kind), u"gen0"_s,
                                     sql
-                                        + sets({u"ChkCatCode=1"_s, u"ChkAccKey=1"_s, u"TxtFromCrd=A'"_s, u"TxtToCrd=Z"_s,
-                                                u"ChkCity=1"_s, u"TxtCity=x"_s, u"ChkPhone=1"_s, u"cmbPhoneType=2"_s,
-                                                u"ChkUseSQLW=1"_s, u"txtSQLWhere=1=1"_s, u"chkFaxField_4=1"_s,
-                                                u"txtFaxExpr_4=OCRD.Phone2"_s, u"CmbSortBy=4"_s, u"CmbSortDir=1"_s,
-                                                u"ChkAllContact=1"_s, u"cmbAddressFrom=1"_s})
+                                        + sets({u"ChkCatCode=1"_s, u"ChkAccKey=1"_s, u"TxtFromCrd=A'"_s,
+                                                u"TxtToCrd=Z"_s, u"ChkCity=1"_s, u"TxtCity=x"_s, u"ChkPhone=1"_s,
+                                                u"cmbPhoneType=2"_s, u"ChkUseSQLW=1"_s, u"txtSQLWhere=1=1"_s,
+                                                u"chkFaxField_4=1"_s, u"txtFaxExpr_4=OCRD.Phone2"_s, u"CmbSortBy=4"_s,
+                                                u"CmbSortDir=1"_s, u"ChkAllContact=1"_s, u"cmbAddressFrom=1"_s})
                                         + kDocuments
                                         + QStringList{u"--properties"_s, u"1,64"_s, u"--groups"_s, u"100"_s}};
     }

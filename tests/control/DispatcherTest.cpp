@@ -21,11 +21,11 @@ TEST_P(Dispatcher, AsksTheOutputsOwnQuestionAndNoStartsNothingButClearsTheStopFl
     messages.answers = {false};
     card->CmdLabPrev_Click();
     ASSERT_EQ(messages.boxes.size(), 1);
-    EXPECT_EQ(messages.boxes[0], (FakeMessages::Box{u"question"_s, u"שאלה חשובה"_s, QString::fromUtf16(GetParam().question)}));
+    EXPECT_EQ(messages.boxes[0],
+              (FakeMessages::Box{u"question"_s, u"שאלה חשובה"_s, QString::fromUtf16(GetParam().question)}));
     EXPECT_FALSE(state.StopRequested);
     EXPECT_TRUE(browser.opened.isEmpty());
 }
-
 
 INSTANTIATE_TEST_SUITE_P(EveryOutputType, Dispatcher,
                          ::testing::Values(OutputCase{-1, u"להתחיל בהכנת המדבקות?"},

@@ -16,10 +16,9 @@ class Initialisation : public MainCardTest {
 protected:
     void pointAt(const QString& company)
     {
-        for (const auto& [key, value] : {std::pair{u"ConnServer"_s, engine->server()},
-                                         std::pair{u"ConnUID"_s, engine->user()},
-                                         std::pair{u"ConnPWD"_s, engine->password()},
-                                         std::pair{u"ConnDataBase"_s, company}})
+        for (const auto& [key, value] :
+             {std::pair{u"ConnServer"_s, engine->server()}, std::pair{u"ConnUID"_s, engine->user()},
+              std::pair{u"ConnPWD"_s, engine->password()}, std::pair{u"ConnDataBase"_s, company}})
             store->setValue(u"Pelmar"_s, u"Params"_s, key, value);
     }
 
@@ -39,8 +38,9 @@ TEST_F(Initialisation, AConfiguredCompanyFillsTheSalesEmployees)
     engine->createCompany(u"SBO_Test"_s, CompanyOptions{});
     pointAt(u"SBO_Test"_s);
     card->UserControl_Initialize();
-    EXPECT_EQ(agents(), (QStringList{u"-ללא איש מכירות-=-1"_s, u"דנה לוי=1"_s, u"יוסי כהן=2"_s, u"Mark Smith=3"_s,
-                                     u"רונית אברהם=5"_s, u"O'Neil & <Partners>=7"_s}));
+    EXPECT_EQ(agents(),
+              (QStringList{u"-ללא איש מכירות-=-1"_s, u"דנה לוי=1"_s, u"יוסי כהן=2"_s, u"Mark Smith=3"_s,
+                           u"רונית אברהם=5"_s, u"O'Neil & <Partners>=7"_s}));
     EXPECT_EQ(c().CmbAgent->currentIndex(), 0) << "the stored agent index 0 is loaded after the list is filled";
 }
 

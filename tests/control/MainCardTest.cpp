@@ -51,9 +51,10 @@ TEST_F(MainCardTest, EveryOptionHasItsControlAndBothFollowEachOther)
             continue;
         auto* widget = card->findChild<QWidget*>(binding.control);
         ASSERT_NE(widget, nullptr) << binding.control.toStdString();
-        const QString text = binding.kind == OptionKind::ListIndex ? QString::number(binding.entries(card->options()) - 1)
-                             : binding.kind == OptionKind::Check ? (optionText(binding, card->options()) == u"1"_s ? u"0"_s : u"1"_s)
-                                                                 : u"ערך של "_s + binding.control;
+        const QString text = binding.kind == OptionKind::ListIndex
+            ? QString::number(binding.entries(card->options()) - 1)
+            : binding.kind == OptionKind::Check ? (optionText(binding, card->options()) == u"1"_s ? u"0"_s : u"1"_s)
+                                                : u"ערך של "_s + binding.control;
         change(widget, text);
         if (binding.kind == OptionKind::Choice)
             EXPECT_EQ(optionText(binding, card->options()), u"True"_s) << binding.control.toStdString();

@@ -93,7 +93,8 @@ TEST_P(DatabaseClientTest, ABadStatementCarriesTheDriversDescription)
         open(u"SELECT * FROM NoSuchTable"_s);
         FAIL() << "the statement must fail";
     } catch (const Failure& failure) {
-        EXPECT_TRUE(failure.description().contains(u"nosuchtable"_s, Qt::CaseInsensitive)) << failure.description().toStdString();
+        EXPECT_TRUE(failure.description().contains(u"nosuchtable"_s, Qt::CaseInsensitive))
+            << failure.description().toStdString();
         EXPECT_NE(failure.number(), 0);
     }
 }

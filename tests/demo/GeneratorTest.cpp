@@ -65,8 +65,10 @@ TEST(CompanyGenerator, TheDataHoldsTheAwkwardValuesOnPurpose)
     EXPECT_TRUE(anyText(cards, u"CardName"_s, [](const QString& s) { return s.contains(u'<') && s.contains(u'&'); }));
     EXPECT_TRUE(anyText(cards, u"CardName"_s, [](const QString& s) { return s.size() > 30; }));
     EXPECT_TRUE(anyText(cards, u"CardCode"_s, [](const QString& s) { return s.contains(u'\''); }));
-    EXPECT_TRUE(anyText(cards, u"CardName"_s, [](const QString& s) { return s.contains(QRegularExpression(u"[א-ת]"_s)); }));
-    EXPECT_TRUE(anyText(cards, u"CardName"_s, [](const QString& s) { return s.contains(QRegularExpression(u"^[A-Za-z]"_s)); }));
+    EXPECT_TRUE(
+        anyText(cards, u"CardName"_s, [](const QString& s) { return s.contains(QRegularExpression(u"[א-ת]"_s)); }));
+    EXPECT_TRUE(
+        anyText(cards, u"CardName"_s, [](const QString& s) { return s.contains(QRegularExpression(u"^[A-Za-z]"_s)); }));
     EXPECT_TRUE(anyText(cards, u"Phone1"_s, [](const QString& s) { return s.contains(u'-'); }));
     EXPECT_TRUE(anyText(cards, u"Phone1"_s, [](const QString& s) { return s.contains(u' '); }));
     EXPECT_TRUE(anyText(cards, u"Phone1"_s, [](const QString& s) { return s.isEmpty(); }));
@@ -83,10 +85,12 @@ TEST(CompanyGenerator, TheDataHoldsTheAwkwardValuesOnPurpose)
         ++contactsPerCard[contact.value(u"CardCode"_s).toString()];
     EXPECT_LT(contactsPerCard.size(), cards.size()) << "some cards have no contact";
     EXPECT_TRUE(std::any_of(contactsPerCard.begin(), contactsPerCard.end(), [](int n) { return n >= 3; }));
-    EXPECT_TRUE(anyText(company.rows(u"OCPR"_s), u"Address"_s, [](const QString& s) { return s.size() > 5 && s.contains(u','); }));
+    EXPECT_TRUE(anyText(company.rows(u"OCPR"_s), u"Address"_s,
+                        [](const QString& s) { return s.size() > 5 && s.contains(u','); }));
     EXPECT_TRUE(anyText(company.rows(u"OCPR"_s), u"Address"_s, [](const QString& s) { return s.size() <= 5; }));
 
-    for (const char16_t* table : {u"OINV", u"ORIN", u"ODLN", u"OPOR", u"OQUT", u"ORCT", u"OCHO", u"OVPM", u"OCRV", u"INV1", u"RIN1"})
+    for (const char16_t* table :
+         {u"OINV", u"ORIN", u"ODLN", u"OPOR", u"OQUT", u"ORCT", u"OCHO", u"OVPM", u"OCRV", u"INV1", u"RIN1"})
         EXPECT_FALSE(company.rows(QString::fromUtf16(table)).isEmpty()) << QString::fromUtf16(table).toStdString();
     QSet<int> years;
     for (const QVariantMap& invoice : company.rows(u"OINV"_s))
@@ -111,8 +115,9 @@ TEST_P(GeneratedCompanyTest, AGeneratedCompanyLoadsWithEveryRowIntact)
         auto rows = engine->client().open(u"SELECT COUNT(*) AS N FROM "_s + name, engine->connString(u"gen"_s));
         EXPECT_EQ(rows->value(u"N"_s).toInt(), expected.rows(name).size()) << name.toStdString();
     }
-    auto card = engine->client().open(u"SELECT CardName, MailAddres, Phone2 FROM OCRD WHERE CardCode LIKE N'_''0000211'"_s,
-                                      engine->connString(u"gen"_s));
+    auto card
+        = engine->client().open(u"SELECT CardName, MailAddres, Phone2 FROM OCRD WHERE CardCode LIKE N'_''0000211'"_s,
+                                engine->connString(u"gen"_s));
     ASSERT_FALSE(card->eof()) << "the code with an apostrophe is stored as it is";
     auto version = engine->client().open(u"SELECT Version FROM CINF"_s, engine->connString(u"gen"_s));
     EXPECT_EQ(version->value(u"Version"_s).toInt() / 1000, 61);

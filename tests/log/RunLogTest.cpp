@@ -21,8 +21,9 @@ TEST_F(RunLogTest, EntriesFollowOneAnotherWithTheirDateTitleAndText)
 {
     WriteLog(u"SELECT 1"_s, u"רשימת מעקב"_s, kMorning);
     WriteLog(u"SELECT 2"_s, u"הפקת מדבקות"_s, kMorning.addSecs(60));
-    EXPECT_EQ(logText(), u">>05-12-26+14:07<br>\r\nרשימת מעקב<br>\r\nSELECT 1<br>\r\n"
-                         ">>05-12-26+14:08<br>\r\nהפקת מדבקות<br>\r\nSELECT 2<br>\r\n"_s);
+    EXPECT_EQ(logText(),
+              u">>05-12-26+14:07<br>\r\nרשימת מעקב<br>\r\nSELECT 1<br>\r\n"
+              ">>05-12-26+14:08<br>\r\nהפקת מדבקות<br>\r\nSELECT 2<br>\r\n"_s);
     EXPECT_TRUE(readFile(runLogPath()).contains("\xf8\xf9\xe9\xee\xfa")) << "the log is windows-1255";
 }
 

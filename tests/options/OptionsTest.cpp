@@ -179,9 +179,9 @@ TEST_F(Options, EachKindOfOptionTakesItsTextOrRefusesItByName)
     set(u"LblDept", u"1"_s);
     EXPECT_EQ(options.deptTag, u"1"_s);
 
-    const std::pair<const char16_t*, QString> refused[] = {
-        {u"CmbSortBy", u"6"_s}, {u"CmbSortBy", u"-2"_s}, {u"CmbSortBy", u"x"_s},
-        {u"ChkTitle_0", u"2"_s}, {u"ChkTitle_0", u"true"_s}, {u"OptOLE_2", u"maybe"_s}};
+    const std::pair<const char16_t*, QString> refused[]
+        = {{u"CmbSortBy", u"6"_s},  {u"CmbSortBy", u"-2"_s},    {u"CmbSortBy", u"x"_s},
+           {u"ChkTitle_0", u"2"_s}, {u"ChkTitle_0", u"true"_s}, {u"OptOLE_2", u"maybe"_s}};
     for (const auto& [control, text] : refused) {
         const MailingOptions before = options;
         try {

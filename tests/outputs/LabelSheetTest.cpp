@@ -52,17 +52,18 @@ protected:
     }
 };
 
-const QString kHead = u"<HTML>\r\n<HEAD>\r\n<TITLE>טרבל מערכות מידע מציגה</TITLE>\r\n"
-                      "<meta http-equiv='Content-Type' content='text/html; charset=windows-1255'>\r\n<style>\r\n"
-                      " TR {vertical-align: middle; text-align: right}\r\n TD {vertical-align: middle}\r\n"
-                      " .TDL {; height: 33.3%; width: 50.0%; vertical-align: middle; text-align: center}\r\n"
-                      " .TBL1 {padding: 1; border-spacing: 0; border-collapse: collapse; border: none; direction: rtl}\r\n"_s;
+const QString kHead
+    = u"<HTML>\r\n<HEAD>\r\n<TITLE>טרבל מערכות מידע מציגה</TITLE>\r\n"
+      "<meta http-equiv='Content-Type' content='text/html; charset=windows-1255'>\r\n<style>\r\n"
+      " TR {vertical-align: middle; text-align: right}\r\n TD {vertical-align: middle}\r\n"
+      " .TDL {; height: 33.3%; width: 50.0%; vertical-align: middle; text-align: center}\r\n"
+      " .TBL1 {padding: 1; border-spacing: 0; border-collapse: collapse; border: none; direction: rtl}\r\n"_s;
 
 QString rulesOf(int line)
 {
     const QString body = u" {font-family:Arial (Hebrew); font-weight:Normal; font-size:9pt; font-style:Normal"_s;
-    return u" .L%1"_s.arg(line) + body + u"; text-align: right; direction: rtl; color:black;}\r\n"_s + u" .LE%1"_s.arg(line)
-           + body + u"; text-align: left; direction: ltr; color:black;}\r\n"_s;
+    return u" .L%1"_s.arg(line) + body + u"; text-align: right; direction: rtl; color:black;}\r\n"_s
+        + u" .LE%1"_s.arg(line) + body + u"; text-align: left; direction: ltr; color:black;}\r\n"_s;
 }
 
 QString cellOf(const QStringList& lines)
@@ -83,17 +84,20 @@ TEST_F(LabelSheet, ASheetIsWrittenByteForByte)
     const QStringList labels[] = {
         {u"    <tr class=L0><td>לכבוד</td></tr>"_s, u"    <tr class=L1><td>אבג בע&quot;מ</td></tr>"_s,
          u"    <tr class=L2><td>קוד: C1</td></tr>"_s, u"    <tr class=L3><td>לידי:משה, רכש</td></tr>"_s,
-         u"    <tr class=L4><td>הרצל 1</td></tr>"_s, u"    <tr class=L5><td>חיפה&nbsp;&nbsp;&nbsp;&nbsp;12345</td></tr>"_s},
+         u"    <tr class=L4><td>הרצל 1</td></tr>"_s,
+         u"    <tr class=L5><td>חיפה&nbsp;&nbsp;&nbsp;&nbsp;12345</td></tr>"_s},
         {u"    <tr class=LE0><td>To</td></tr>"_s, u"    <tr class=LE1><td>Smith &amp; &lt;Sons&gt;</td></tr>"_s,
          u"    <tr class=LE2><td>Code: C2</td></tr>"_s, u"    <tr class=LE3><td>Attn:ABC, DEF</td></tr>"_s,
          u"    <tr class=LE4><td>12 Main St</td></tr>"_s,
          u"    <tr class=LE5><td>Springfield&nbsp;&nbsp;&nbsp;&nbsp;999</td></tr>"_s},
         {u"    <tr class=L0><td>לכבוד</td></tr>"_s, u"    <tr class=L1><td>ABCDEFGHIJKLMNOPQRSTUVWXYZ0123</td></tr>"_s,
-         u"    <tr class=L2><td>קוד: C3</td></tr>"_s, u"    <tr class=L5><td>תל אביב&nbsp;&nbsp;&nbsp;&nbsp;</td></tr>"_s},
+         u"    <tr class=L2><td>קוד: C3</td></tr>"_s,
+         u"    <tr class=L5><td>תל אביב&nbsp;&nbsp;&nbsp;&nbsp;</td></tr>"_s},
         {u"    <tr class=LE0><td>To</td></tr>"_s, u"    <tr class=LE1><td>Null Address Co</td></tr>"_s,
          u"    <tr class=LE2><td>Code: C4</td></tr>"_s, u"    <tr class=LE5><td>&nbsp;&nbsp;&nbsp;&nbsp;</td></tr>"_s},
         {u"    <tr class=L0><td>לכבוד</td></tr>"_s, u"    <tr class=L1><td>חמש</td></tr>"_s,
-         u"    <tr class=L2><td>קוד: C5</td></tr>"_s, u"    <tr class=L5><td>עכו&nbsp;&nbsp;&nbsp;&nbsp;55</td></tr>"_s},
+         u"    <tr class=L2><td>קוד: C5</td></tr>"_s,
+         u"    <tr class=L5><td>עכו&nbsp;&nbsp;&nbsp;&nbsp;55</td></tr>"_s},
         {u"    <tr><td>&nbsp;</td></tr>"_s},
     };
     for (int row = 0; row < 3; ++row) {
@@ -107,13 +111,15 @@ TEST_F(LabelSheet, TheStartPositionLeavesCellsOfTheFirstPageBlank)
 {
     lines({2});
     options.startFrom = u"5"_s;
-    EXPECT_EQ(cells(sheet()), (QStringList{u"-"_s, u"-"_s, u"-"_s, u"-"_s, u"קוד: C1"_s, u"Code: C2"_s,
-                                           u"קוד: C3"_s, u"Code: C4"_s, u"קוד: C5"_s, u"-"_s, u"-"_s, u"-"_s}));
+    EXPECT_EQ(cells(sheet()),
+              (QStringList{u"-"_s, u"-"_s, u"-"_s, u"-"_s, u"קוד: C1"_s, u"Code: C2"_s, u"קוד: C3"_s, u"Code: C4"_s,
+                           u"קוד: C5"_s, u"-"_s, u"-"_s, u"-"_s}));
     options.startFrom = u"8"_s;
     const QStringList beyond = cells(sheet());
     ASSERT_EQ(beyond.size(), 12) << "start 8 of 6 cells: positions 1..12 over two pages";
     EXPECT_EQ(beyond.mid(0, 6), QStringList(6, u"-"_s));
-    EXPECT_EQ(beyond.mid(6), (QStringList{u"קוד: C1"_s, u"Code: C2"_s, u"קוד: C3"_s, u"Code: C4"_s, u"קוד: C5"_s, u"-"_s}));
+    EXPECT_EQ(beyond.mid(6),
+              (QStringList{u"קוד: C1"_s, u"Code: C2"_s, u"קוד: C3"_s, u"Code: C4"_s, u"קוד: C5"_s, u"-"_s}));
 }
 
 TEST_F(LabelSheet, CopiesFillConsecutiveCellsAndZeroCopiesWriteNoPage)
@@ -123,8 +129,9 @@ TEST_F(LabelSheet, CopiesFillConsecutiveCellsAndZeroCopiesWriteNoPage)
     options.startFrom = u"2"_s;
     const QStringList copies = cells(sheet());
     ASSERT_EQ(copies.size(), 18) << "3 × (2 + 5 - 1) positions make three pages of six";
-    EXPECT_EQ(copies.mid(0, 8), (QStringList{u"-"_s, u"קוד: C1"_s, u"קוד: C1"_s, u"קוד: C1"_s, u"Code: C2"_s,
-                                             u"Code: C2"_s, u"Code: C2"_s, u"קוד: C3"_s}));
+    EXPECT_EQ(copies.mid(0, 8),
+              (QStringList{u"-"_s, u"קוד: C1"_s, u"קוד: C1"_s, u"קוד: C1"_s, u"Code: C2"_s, u"Code: C2"_s,
+                           u"Code: C2"_s, u"קוד: C3"_s}));
     EXPECT_EQ(copies.mid(16), (QStringList{u"-"_s, u"-"_s}));
 
     options.copies = u"0"_s;
@@ -208,8 +215,9 @@ TEST_F(LabelSheet, ABadLayoutFailsBeforeTheFileIsTouchedAndOpensNothing)
 {
     const QString path = tempPath(u"pelmar1.htm"_s);
     writeFile(path, "previous sheet");
-    for (const auto& [box, text] : {std::pair{&MailingOptions::rows, u"0"_s}, std::pair{&MailingOptions::copies, u"abc"_s},
-                                    std::pair{&MailingOptions::cols, u"40000"_s}}) {
+    for (const auto& [box, text] :
+         {std::pair{&MailingOptions::rows, u"0"_s}, std::pair{&MailingOptions::copies, u"abc"_s},
+          std::pair{&MailingOptions::cols, u"40000"_s}}) {
         const QString kept = options.*box;
         options.*box = text;
         try {
@@ -236,11 +244,12 @@ TEST(LabelSizes, CellSizesHaveTwoIntegerDigitsAndOneDecimal)
 TEST(LabelStyleRules, FontWeightSizeItalicAndUnderline)
 {
     LabelDefRec david{1, 14, 2, 1, 0, {}};
-    EXPECT_EQ(labelStyleRules(1, david),
-              (QStringList{u" .L1 {font-family:David; font-weight:Bold; font-size:14pt; font-style:Normal; text-decoration: "
-                           "underline; text-align: right; direction: rtl; color:black;}"_s,
-                           u" .LE1 {font-family:David; font-weight:Bold; font-size:14pt; font-style:Normal; text-decoration: "
-                           "underline; text-align: left; direction: ltr; color:black;}"_s}));
+    EXPECT_EQ(
+        labelStyleRules(1, david),
+        (QStringList{u" .L1 {font-family:David; font-weight:Bold; font-size:14pt; font-style:Normal; text-decoration: "
+                     "underline; text-align: right; direction: rtl; color:black;}"_s,
+                     u" .LE1 {font-family:David; font-weight:Bold; font-size:14pt; font-style:Normal; text-decoration: "
+                     "underline; text-align: left; direction: ltr; color:black;}"_s}));
     LabelDefRec miriam{2, 0, 1, 0, 1, {}};
     EXPECT_EQ(labelStyleRules(12, miriam)[0],
               u" .L12 {font-family:Miriam; font-weight:Bolder; font-size:0pt; font-style:Italic; text-align: right; "

@@ -2,7 +2,6 @@
 #include "settings/SettingsStore.h"
 #include "support/Isolated.h"
 
-
 using namespace Qt::StringLiterals;
 
 namespace pelmar::test {
@@ -10,7 +9,10 @@ namespace {
 
 class LabelStyles : public Isolated {
 protected:
-    QString key(int line, const QString& name) { return store.value(u"Pelmar"_s, u"LabelDef"_s + QString::number(line), name, u"<none>"_s); }
+    QString key(int line, const QString& name)
+    {
+        return store.value(u"Pelmar"_s, u"LabelDef"_s + QString::number(line), name, u"<none>"_s);
+    }
     SettingsStore store{path(u"config/Pelmar"_s)};
     LabelDefTable defs{};
 };

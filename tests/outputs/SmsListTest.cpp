@@ -49,7 +49,8 @@ TEST_F(SmsListTest, TheRunAsksForTheFileReplacesItAndSaysTheListIsReady)
     EXPECT_EQ(files.calls[0].defaultName, u"smslist"_s);
     EXPECT_EQ(readFile(path), QByteArray("052-999\r\n050-222\r\n054 777\r\n"));
     ASSERT_EQ(messages.boxes.size(), 1);
-    EXPECT_EQ(messages.boxes[0], (FakeMessages::Box{u"information"_s, u"הודעה"_s, u"קובץ רשימת הטלפונים הניידים מוכן"_s}));
+    EXPECT_EQ(messages.boxes[0],
+              (FakeMessages::Box{u"information"_s, u"הודעה"_s, u"קובץ רשימת הטלפונים הניידים מוכן"_s}));
 }
 
 TEST_F(SmsListTest, ACancelledDialogIsReportedAndWritesNothing)

@@ -34,9 +34,16 @@ TEST_F(CardFileTest, FieldsAreCutAtTabsWithTheFallbacksOfShortLines)
     EXPECT_EQ(readCardFile(tabs, 1, false), (QStringList{u"header"_s, u"A"_s, u"B"_s, u"C001"_s, u""_s, u"D"_s}));
     EXPECT_EQ(readCardFile(file("A\tB\r\nX\tY\tZ\r\n"), 3, false), (QStringList{u"A"_s, u"Z"_s}))
         << "column 3 on a line with a single tab falls back to the first field";
-    EXPECT_EQ(readCardFile(file("\xEF\xBB\xBF" "קוד\r\nא1\r\n"), 1, true), QStringList{u"א1"_s});
+    EXPECT_EQ(readCardFile(file("\xEF\xBB\xBF"
+                                "קוד\r\nא1\r\n"),
+                           1, true),
+              QStringList{u"א1"_s});
     EXPECT_EQ(readCardFile(file("h\rC1\rC2"), 1, true), (QStringList{u"C1"_s, u"C2"_s})) << "carriage returns alone";
-    EXPECT_EQ(readCardFile(file("\xf7\xe5\xe3\r\n\xe0" "1\r\n"), 1, true), QStringList{u"א1"_s}) << "windows-1255";
+    EXPECT_EQ(readCardFile(file("\xf7\xe5\xe3\r\n\xe0"
+                                "1\r\n"),
+                           1, true),
+              QStringList{u"א1"_s})
+        << "windows-1255";
     EXPECT_THROW(cardFileColumn(u"two"_s), Failure);
     EXPECT_THROW(cardFileColumn(u"0"_s), Failure);
 }
@@ -47,7 +54,6 @@ TEST(CheckListModel, TextsSortWithNumbersByValueFirst)
     numbers.setRows({{u"a"_s, {u"100"_s}}, {u"b"_s, {u"x"_s}}, {u"c"_s, {u"20"_s}}, {u"d"_s, {u"3.5"_s}}});
     numbers.sortByText(0);
     EXPECT_EQ(texts(numbers), (QStringList{u"3.5"_s, u"20"_s, u"100"_s, u"x"_s})) << "numbers by value";
-
 }
 
 }  // namespace

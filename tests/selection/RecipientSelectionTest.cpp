@@ -58,7 +58,8 @@ QList<QVariantMap> contactsOf(const QVariantMap& card, bool mainOnly)
     for (const QVariantMap& contact : company().rows(u"OCPR"_s)) {
         if (contact.value(u"CardCode"_s) != card.value(u"CardCode"_s))
             continue;
-        if (!mainOnly || (!card.value(u"CntctPrsn"_s).isNull() && contact.value(u"Name"_s) == card.value(u"CntctPrsn"_s)))
+        if (!mainOnly
+            || (!card.value(u"CntctPrsn"_s).isNull() && contact.value(u"Name"_s) == card.value(u"CntctPrsn"_s)))
             found << contact;
     }
     return found;
@@ -117,16 +118,25 @@ QList<SelectionCase> selectionCases()
         {"customers of two groups",
          [](MailingOptions& c, SessionState& s) {
              c.catCode = true;
-             s.SelCardGroups = {CardGroupSel{}, CardGroupSel{100, true}, CardGroupSel{101, false}, CardGroupSel{103, true}};
+             s.SelCardGroups
+                 = {CardGroupSel{}, CardGroupSel{100, true}, CardGroupSel{101, false}, CardGroupSel{103, true}};
          },
          [](const QVariantMap& card) {
              const int group = card.value(u"GroupCode"_s).toInt();
              return text(card, u"CardType"_s) == u"C"_s && (group == 100 || group == 103);
          }},
-        {"leads", [](MailingOptions& c, SessionState&) { c.catCode = true; c.cardType = 2; },
+        {"leads",
+         [](MailingOptions& c, SessionState&) {
+             c.catCode = true;
+             c.cardType = 2;
+         },
          [](const QVariantMap& card) { return text(card, u"CardType"_s) == u"L"_s; }},
         {"code range",
-         [](MailingOptions& c, SessionState&) { c.codeRange = true; c.fromCard = u"C0000010"_s; c.toCard = u"L0000200"_s; },
+         [](MailingOptions& c, SessionState&) {
+             c.codeRange = true;
+             c.fromCard = u"C0000010"_s;
+             c.toCard = u"L0000200"_s;
+         },
          [](const QVariantMap& card) {
              const QString code = text(card, u"CardCode"_s);
              return code >= u"C0000010"_s && code <= u"L0000200"_s;
@@ -138,73 +148,168 @@ QList<SelectionCase> selectionCases()
              c.toCard = apostropheCodeType() + u"'9999999"_s;
          },
          [](const QVariantMap& card) { return text(card, u"CardCode"_s).startsWith(apostropheCodeType() + u'\''); }},
-        {"city of the mailing address", [](MailingOptions& c, SessionState&) { c.city = true; c.cityPrefix = u"חי"_s; c.addressFrom = 0; },
+        {"city of the mailing address",
+         [](MailingOptions& c, SessionState&) {
+             c.city = true;
+             c.cityPrefix = u"חי"_s;
+             c.addressFrom = 0;
+         },
          [](const QVariantMap& card) { return startsWith(card, u"MailCity"_s, u"חי"_s); }},
-        {"city of the card address", [](MailingOptions& c, SessionState&) { c.city = true; c.cityPrefix = u"ב"_s; c.addressFrom = 1; },
+        {"city of the card address",
+         [](MailingOptions& c, SessionState&) {
+             c.city = true;
+             c.cityPrefix = u"ב"_s;
+             c.addressFrom = 1;
+         },
          [](const QVariantMap& card) { return startsWith(card, u"City"_s, u"ב"_s); }},
-        {"hostile city", [](MailingOptions& c, SessionState&) { c.city = true; c.cityPrefix = u"x' OR '1'='1"_s; },
+        {"hostile city",
+         [](MailingOptions& c, SessionState&) {
+             c.city = true;
+             c.cityPrefix = u"x' OR '1'='1"_s;
+         },
          [](const QVariantMap&) { return false; }},
-        {"phone 1", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 0; c.phonePrefix = u"04 "_s; },
+        {"phone 1",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 0;
+             c.phonePrefix = u"04 "_s;
+         },
          [](const QVariantMap& card) { return startsWith(card, u"Phone1"_s, u"04 "_s); }},
-        {"phone 2", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 1; c.phonePrefix = u"+972"_s; },
+        {"phone 2",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 1;
+             c.phonePrefix = u"+972"_s;
+         },
          [](const QVariantMap& card) { return startsWith(card, u"Phone2"_s, u"+972"_s); }},
-        {"mobile", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 2; c.phonePrefix = u"052"_s; },
+        {"mobile",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 2;
+             c.phonePrefix = u"052"_s;
+         },
          [](const QVariantMap& card) { return startsWith(card, u"Cellular"_s, u"052"_s); }},
-        {"fax", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 3; c.phonePrefix = u"04-"_s; },
+        {"fax",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 3;
+             c.phonePrefix = u"04-"_s;
+         },
          [](const QVariantMap& card) { return startsWith(card, u"Fax"_s, u"04-"_s); }},
-        {"main contact's mobile", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 4; c.phonePrefix = u"05"_s; },
+        {"main contact's mobile",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 4;
+             c.phonePrefix = u"05"_s;
+         },
          [](const QVariantMap& card) {
              const auto contacts = contactsOf(card, true);
              return std::any_of(contacts.begin(), contacts.end(),
                                 [](const QVariantMap& p) { return startsWith(p, u"Cellolar"_s, u"05"_s); });
          }},
         {"any contact's mobile",
-         [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 4; c.phonePrefix = u"05"_s; c.allContacts = true; },
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 4;
+             c.phonePrefix = u"05"_s;
+             c.allContacts = true;
+         },
          [](const QVariantMap& card) {
              const auto contacts = contactsOf(card, false);
              return std::any_of(contacts.begin(), contacts.end(),
                                 [](const QVariantMap& p) { return startsWith(p, u"Cellolar"_s, u"05"_s); });
          }},
-        {"sales employee", [](MailingOptions& c, SessionState&) { c.agent = true; c.agents = {{u"יוסי כהן"_s, 2}}; c.agentIndex = 0; },
+        {"sales employee",
+         [](MailingOptions& c, SessionState&) {
+             c.agent = true;
+             c.agents = {{u"יוסי כהן"_s, 2}};
+             c.agentIndex = 0;
+         },
          [](const QVariantMap& card) { return card.value(u"SlpCode"_s).toInt() == 2; }},
         {"invoices in a period from a number",
          [](MailingOptions& c, SessionState&) {
-             c.dates = true; c.fromDate = u"1/1/10"_s; c.toDate = u"31/12/2015"_s; c.fromDocNum = u"1010"_s;
+             c.dates = true;
+             c.fromDate = u"1/1/10"_s;
+             c.toDate = u"31/12/2015"_s;
+             c.fromDocNum = u"1010"_s;
          },
-         [=](const QVariantMap& card) { return hasDocument(card, u"OINV"_s, u"CardCode"_s, u"DocDate"_s, from, to, 1010); }},
+         [=](const QVariantMap& card) {
+             return hasDocument(card, u"OINV"_s, u"CardCode"_s, u"DocDate"_s, from, to, 1010);
+         }},
         {"credit card payments in a period",
-         [](MailingOptions& c, SessionState&) { c.dates = true; c.fromDate = u"1/1/10"_s; c.toDate = u"31/12/15"_s; c.docType = 8; },
+         [](MailingOptions& c, SessionState&) {
+             c.dates = true;
+             c.fromDate = u"1/1/10"_s;
+             c.toDate = u"31/12/15"_s;
+             c.docType = 8;
+         },
          [=](const QVariantMap& card) { return hasDocument(card, u"OCRV"_s, u"CardCode"_s, u"PayDate"_s, from, to); }},
         {"no checks in a period",
          [](MailingOptions& c, SessionState&) {
-             c.dates = true; c.fromDate = u"1/1/10"_s; c.toDate = u"31/12/15"_s; c.docType = 6; c.byDoc = 1;
+             c.dates = true;
+             c.fromDate = u"1/1/10"_s;
+             c.toDate = u"31/12/15"_s;
+             c.docType = 6;
+             c.byDoc = 1;
          },
-         [=](const QVariantMap& card) { return !hasDocument(card, u"OCHO"_s, u"VendorCode"_s, u"PmntDate"_s, from, to); }},
+         [=](const QVariantMap& card) {
+             return !hasDocument(card, u"OCHO"_s, u"VendorCode"_s, u"PmntDate"_s, from, to);
+         }},
         {"no quotations in a period",
          [](MailingOptions& c, SessionState&) {
-             c.dates = true; c.fromDate = u"1/1/10"_s; c.toDate = u"31/12/15"_s; c.docType = 4; c.byDoc = 1;
+             c.dates = true;
+             c.fromDate = u"1/1/10"_s;
+             c.toDate = u"31/12/15"_s;
+             c.docType = 4;
+             c.byDoc = 1;
          },
          [=](const QVariantMap& card) { return !hasDocument(card, u"OQUT"_s, u"CardCode"_s, u"DocDate"_s, from, to); }},
-        {"items bought", [](MailingOptions& c, SessionState&) { c.items = true; c.fromItem = u"I0010"_s; c.toItem = u"I0050"_s; },
+        {"items bought",
+         [](MailingOptions& c, SessionState&) {
+             c.items = true;
+             c.fromItem = u"I0010"_s;
+             c.toItem = u"I0050"_s;
+         },
          [](const QVariantMap& card) { return boughtItem(card, u"I0010"_s, u"I0050"_s); }},
-        {"items with an apostrophe", [](MailingOptions& c, SessionState&) { c.items = true; c.fromItem = u"I'0000"_s; c.toItem = u"I'9999"_s; },
+        {"items with an apostrophe",
+         [](MailingOptions& c, SessionState&) {
+             c.items = true;
+             c.fromItem = u"I'0000"_s;
+             c.toItem = u"I'9999"_s;
+         },
          [](const QVariantMap& card) { return boughtItem(card, u"I'0000"_s, u"I'9999"_s); }},
         {"properties 3 and 7",
-         [](MailingOptions& c, SessionState& s) { c.properties = true; s.QryGroupSel[3] = s.QryGroupSel[7] = true; },
-         [](const QVariantMap& card) { return text(card, u"QryGroup3"_s) == u"Y"_s && text(card, u"QryGroup7"_s) == u"Y"_s; }},
+         [](MailingOptions& c, SessionState& s) {
+             c.properties = true;
+             s.QryGroupSel[3] = s.QryGroupSel[7] = true;
+         },
+         [](const QVariantMap& card) {
+             return text(card, u"QryGroup3"_s) == u"Y"_s && text(card, u"QryGroup7"_s) == u"Y"_s;
+         }},
         {"properties 3 or 7",
          [](MailingOptions& c, SessionState& s) {
-             c.properties = true; s.QryGroupSel[3] = s.QryGroupSel[7] = true; s.QryGroupRelation = u"OR"_s;
+             c.properties = true;
+             s.QryGroupSel[3] = s.QryGroupSel[7] = true;
+             s.QryGroupRelation = u"OR"_s;
          },
-         [](const QVariantMap& card) { return text(card, u"QryGroup3"_s) == u"Y"_s || text(card, u"QryGroup7"_s) == u"Y"_s; }},
+         [](const QVariantMap& card) {
+             return text(card, u"QryGroup3"_s) == u"Y"_s || text(card, u"QryGroup7"_s) == u"Y"_s;
+         }},
         {"suppliers in a city with checks",
          [](MailingOptions& c, SessionState&) {
-             c.catCode = true; c.cardType = 1; c.city = true; c.cityPrefix = u"ת"_s;
-             c.dates = true; c.fromDate = u"1/1/03"_s; c.toDate = u"31/12/25"_s; c.docType = 6;
+             c.catCode = true;
+             c.cardType = 1;
+             c.city = true;
+             c.cityPrefix = u"ת"_s;
+             c.dates = true;
+             c.fromDate = u"1/1/03"_s;
+             c.toDate = u"31/12/25"_s;
+             c.docType = 6;
          },
          [](const QVariantMap& card) {
              return text(card, u"CardType"_s) == u"S"_s && startsWith(card, u"MailCity"_s, u"ת"_s)
-                    && hasDocument(card, u"OCHO"_s, u"VendorCode"_s, u"PmntDate"_s, QDate(2003, 1, 1), QDate(2025, 12, 31));
+                 && hasDocument(card, u"OCHO"_s, u"VendorCode"_s, u"PmntDate"_s, QDate(2003, 1, 1),
+                                QDate(2025, 12, 31));
          }},
     };
 }
@@ -221,7 +326,8 @@ protected:
     QSet<QString> cardsOf(const MailingOptions& c, const SessionState& s)
     {
         QSet<QString> codes;
-        for (auto rows = run(BuildSelect(c, 1, c.docType, false, kCardList) + BuildWhere(c, s)); !rows->eof(); rows->moveNext())
+        for (auto rows = run(BuildSelect(c, 1, c.docType, false, kCardList) + BuildWhere(c, s)); !rows->eof();
+             rows->moveNext())
             codes.insert(rows->value(u"CardCode"_s).toString());
         return codes;
     }
@@ -304,7 +410,8 @@ TEST_P(RecipientSelection, TheAddressSourceAndSchemaLevelChooseTheLabelColumns)
             c.toDate = u"31/12/25"_s;
         }
         int checked = 0;
-        auto rows = run(BuildSelect(c, a.level, 0, true, kLabels) + BuildWhere(c, SessionState{}) + BuildOrderBy(c, a.level, 0, kLabels));
+        auto rows = run(BuildSelect(c, a.level, 0, true, kLabels) + BuildWhere(c, SessionState{})
+                        + BuildOrderBy(c, a.level, 0, kLabels));
         for (; !rows->eof(); rows->moveNext(), ++checked) {
             const QVariantMap& card = cards[rows->value(u"CardCode"_s).toString()];
             ASSERT_EQ(rows->value(u"MailCity"_s).toString(), a.city(card)) << a.source;
@@ -334,7 +441,7 @@ TEST_P(RecipientSelection, EveryOrderTheUserCanChooseIsAcceptedByTheDatabase)
                     c.faxExpr[4] = u"OCRD.Phone2"_s;
                     const bool details = kind != kCardList;
                     const QString statement = BuildSelect(c, 1, docType, details, kind) + BuildWhere(c, SessionState{})
-                                              + BuildOrderBy(c, 1, docType, kind);
+                        + BuildOrderBy(c, 1, docType, kind);
                     EXPECT_NO_THROW(run(statement)) << statement.toStdString();
                 }
             }

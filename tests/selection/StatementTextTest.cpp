@@ -22,7 +22,8 @@ TEST(StatementText, TheDocumentedExamplesComeOutByteForByte)
     groups.catCode = true;
     groups.cardType = 0;
     state.SelCardGroups = {CardGroupSel{}, CardGroupSel{100, true}, CardGroupSel{101, false}, CardGroupSel{103, true}};
-    EXPECT_EQ(BuildWhere(groups, state), u" Where (1 > 0) AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s);
+    EXPECT_EQ(BuildWhere(groups, state),
+              u" Where (1 > 0) AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s);
 
     EXPECT_EQ(BuildDatesCriteria(QDate(2005, 3, 1), QDate(2005, 3, 31), 0, 0, u"1000"_s, {}),
               u" AND OINV.DocDate Between '03/01/2005' And '03/31/2005' And OINV.DocNum>=1000"_s);
@@ -53,47 +54,134 @@ TEST(StatementText, EachCriterionAddsItsFragmentInOrder)
 {
     const WhereCase cases[] = {
         {"nothing on", [](MailingOptions&, SessionState&) {}, u" Where (1 > 0)"_s},
-        {"type without groups", [](MailingOptions& c, SessionState&) { c.catCode = true; c.cardType = 1; },
+        {"type without groups",
+         [](MailingOptions& c, SessionState&) {
+             c.catCode = true;
+             c.cardType = 1;
+         },
          u" Where (1 > 0) AND OCRD.CardType = 'S'"_s},
-        {"no type chosen", [](MailingOptions& c, SessionState&) { c.catCode = true; c.cardType = -1; },
+        {"no type chosen",
+         [](MailingOptions& c, SessionState&) {
+             c.catCode = true;
+             c.cardType = -1;
+         },
          u" Where (1 > 0) AND OCRD.CardType = 'All'"_s},
-        {"leads", [](MailingOptions& c, SessionState&) { c.catCode = true; c.cardType = 2; },
+        {"leads",
+         [](MailingOptions& c, SessionState&) {
+             c.catCode = true;
+             c.cardType = 2;
+         },
          u" Where (1 > 0) AND OCRD.CardType = 'L'"_s},
-        {"code range with apostrophes", [](MailingOptions& c, SessionState&) { c.codeRange = true; c.fromCard = u"C'01"_s; c.toCard = u"C'09"_s; },
+        {"code range with apostrophes",
+         [](MailingOptions& c, SessionState&) {
+             c.codeRange = true;
+             c.fromCard = u"C'01"_s;
+             c.toCard = u"C'09"_s;
+         },
          u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'C''01' And N'C''09'"_s},
         {"empty code range", [](MailingOptions& c, SessionState&) { c.codeRange = true; },
          u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'' And N''"_s},
-        {"city of the mailing address", [](MailingOptions& c, SessionState&) { c.city = true; c.cityPrefix = u"קריית"_s; c.addressFrom = 0; },
+        {"city of the mailing address",
+         [](MailingOptions& c, SessionState&) {
+             c.city = true;
+             c.cityPrefix = u"קריית"_s;
+             c.addressFrom = 0;
+         },
          u" Where (1 > 0) AND OCRD.MailCity LIKE N'קריית%'"_s},
-        {"city of the card address", [](MailingOptions& c, SessionState&) { c.city = true; c.cityPrefix = u"ב'"_s; c.addressFrom = 1; },
+        {"city of the card address",
+         [](MailingOptions& c, SessionState&) {
+             c.city = true;
+             c.cityPrefix = u"ב'"_s;
+             c.addressFrom = 1;
+         },
          u" Where (1 > 0) AND OCRD.City LIKE N'ב''%'"_s},
-        {"phone 2", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 1; c.phonePrefix = u"03"_s; },
+        {"phone 2",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 1;
+             c.phonePrefix = u"03"_s;
+         },
          u" Where (1 > 0) AND OCRD.Phone2 LIKE N'03%'"_s},
-        {"mobile", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 2; c.phonePrefix = u"05"_s; },
+        {"mobile",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 2;
+             c.phonePrefix = u"05"_s;
+         },
          u" Where (1 > 0) AND OCRD.Cellular LIKE N'05%'"_s},
-        {"fax", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 3; c.phonePrefix = u"04"_s; },
+        {"fax",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 3;
+             c.phonePrefix = u"04"_s;
+         },
          u" Where (1 > 0) AND OCRD.Fax LIKE N'04%'"_s},
-        {"contact mobile", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = 4; c.phonePrefix = u"052"_s; },
+        {"contact mobile",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = 4;
+             c.phonePrefix = u"052"_s;
+         },
          u" Where (1 > 0) AND OCPR.Cellolar LIKE N'052%'"_s},
-        {"no phone type", [](MailingOptions& c, SessionState&) { c.phone = true; c.phoneType = -1; },
+        {"no phone type",
+         [](MailingOptions& c, SessionState&) {
+             c.phone = true;
+             c.phoneType = -1;
+         },
          u" Where (1 > 0) AND OCRD.Phone1 LIKE N'%'"_s},
-        {"sales employee", [](MailingOptions& c, SessionState&) { c.agent = true; c.agents = {{u"ללא"_s, -1}}; c.agentIndex = 0; },
+        {"sales employee",
+         [](MailingOptions& c, SessionState&) {
+             c.agent = true;
+             c.agents = {{u"ללא"_s, -1}};
+             c.agentIndex = 0;
+         },
          u" Where (1 > 0) AND OCRD.SlpCode = -1"_s},
-        {"documents present", [](MailingOptions& c, SessionState&) { c.dates = true; c.fromDate = u"31/12/99"_s; c.toDate = u"1/1/00"_s; c.docType = 2; c.toDocNum = u"77"_s; },
+        {"documents present",
+         [](MailingOptions& c, SessionState&) {
+             c.dates = true;
+             c.fromDate = u"31/12/99"_s;
+             c.toDate = u"1/1/00"_s;
+             c.docType = 2;
+             c.toDocNum = u"77"_s;
+         },
          u" Where (1 > 0) AND ODLN.DocDate Between '12/31/1999' And '01/01/2000' And ODLN.DocNum<=77"_s},
-        {"checks absent", [](MailingOptions& c, SessionState&) { c.dates = true; c.fromDate = u"15/6/2004"_s; c.toDate = u"5/3/05"_s; c.docType = 6; c.byDoc = 1; },
+        {"checks absent",
+         [](MailingOptions& c, SessionState&) {
+             c.dates = true;
+             c.fromDate = u"15/6/2004"_s;
+             c.toDate = u"5/3/05"_s;
+             c.docType = 6;
+             c.byDoc = 1;
+         },
          u" Where (1 > 0) AND OCRD.CardCode Not In (Select Distinct VendorCode From OCHO Where OCHO.PmntDate Between '06/15/2004' And '03/05/2005')"_s},
-        {"documents with no relation", [](MailingOptions& c, SessionState&) { c.dates = true; c.fromDate = c.toDate = u"1/1/05"_s; c.byDoc = -1; },
+        {"documents with no relation",
+         [](MailingOptions& c, SessionState&) {
+             c.dates = true;
+             c.fromDate = c.toDate = u"1/1/05"_s;
+             c.byDoc = -1;
+         },
          u" Where (1 > 0)"_s},
-        {"items", [](MailingOptions& c, SessionState&) { c.items = true; c.fromItem = u"A'1"_s; c.toItem = u"B"_s; },
+        {"items",
+         [](MailingOptions& c, SessionState&) {
+             c.items = true;
+             c.fromItem = u"A'1"_s;
+             c.toItem = u"B"_s;
+         },
          u" Where (1 > 0) AND (OCRD.CardCode IN (SELECT CardCode FROM OINV, INV1 Where INV1.DocEntry = OINV.DocEntry And INV1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode) OR OCRD.CardCode IN (SELECT CardCode FROM ORIN, RIN1 Where RIN1.DocEntry = ORIN.DocEntry And RIN1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode))"_s},
         {"properties none chosen", [](MailingOptions& c, SessionState&) { c.properties = true; },
          u" Where (1 > 0) And (1>0)"_s},
-        {"properties default AND", [](MailingOptions& c, SessionState& s) { c.properties = true; s.QryGroupSel[1] = s.QryGroupSel[64] = true; },
+        {"properties default AND",
+         [](MailingOptions& c, SessionState& s) {
+             c.properties = true;
+             s.QryGroupSel[1] = s.QryGroupSel[64] = true;
+         },
          u" Where (1 > 0) And (OCRD.QryGroup1='Y' AND OCRD.QryGroup64='Y')"_s},
-        {"free SQL empty", [](MailingOptions& c, SessionState&) { c.sqlWhere = true; },
-         u" Where (1 > 0)"_s},
-        {"free SQL as typed", [](MailingOptions& c, SessionState&) { c.sqlWhere = true; c.sqlWhereText = u"OCRD.Notes LIKE 'x%'"_s; },
+        {"free SQL empty", [](MailingOptions& c, SessionState&) { c.sqlWhere = true; }, u" Where (1 > 0)"_s},
+        {"free SQL as typed",
+         [](MailingOptions& c, SessionState&) {
+             c.sqlWhere = true;
+             c.sqlWhereText = u"OCRD.Notes LIKE 'x%'"_s;
+         },
          u" Where (1 > 0) And OCRD.Notes LIKE 'x%'"_s},
     };
     for (const WhereCase& c : cases) {
@@ -108,10 +196,26 @@ TEST(StatementText, ACriterionThatCannotBeReadIsNamedInsteadOfBreakingTheStateme
 {
     const std::pair<std::function<void(MailingOptions&)>, QString> cases[] = {
         {[](MailingOptions& c) { c.agent = true; }, u"סוכן"_s},
-        {[](MailingOptions& c) { c.dates = true; c.fromDate = u"yesterday"_s; c.toDate = u"1/1/05"_s; }, u"yesterday"_s},
-        {[](MailingOptions& c) { c.dates = true; c.fromDate = u"1/1/05"_s; c.toDate = u"1/1/05"_s; c.fromDocNum = u"1; DROP TABLE OCRD"_s; },
+        {[](MailingOptions& c) {
+             c.dates = true;
+             c.fromDate = u"yesterday"_s;
+             c.toDate = u"1/1/05"_s;
+         },
+         u"yesterday"_s},
+        {[](MailingOptions& c) {
+             c.dates = true;
+             c.fromDate = u"1/1/05"_s;
+             c.toDate = u"1/1/05"_s;
+             c.fromDocNum = u"1; DROP TABLE OCRD"_s;
+         },
          u"1; DROP TABLE OCRD"_s},
-        {[](MailingOptions& c) { c.dates = true; c.fromDate = u"1/1/05"_s; c.toDate = u"1/1/05"_s; c.toDocNum = u"12.5"_s; }, u"12.5"_s},
+        {[](MailingOptions& c) {
+             c.dates = true;
+             c.fromDate = u"1/1/05"_s;
+             c.toDate = u"1/1/05"_s;
+             c.toDocNum = u"12.5"_s;
+         },
+         u"12.5"_s},
     };
     for (const auto& [set, named] : cases) {
         MailingOptions criteria;
@@ -141,14 +245,19 @@ TEST(StatementText, DatesAreReadDayFirstWithTwoDigitYearsAndRollOver)
 TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
 {
     MailingOptions c;
-    EXPECT_EQ(BuildSelect(c, 1, 0, false, kCardList),
-              u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
+    EXPECT_EQ(
+        BuildSelect(c, 1, 0, false, kCardList),
+        u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
     c.allContacts = true;
     c.addressFrom = 1;
     c.deptTag = u"1"_s;
-    EXPECT_EQ(BuildSelect(c, 1, 0, true, kLetters),
-              u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Address MailAddres, OCRD.County MailCounty, OCRD.City MailCity, OCRD.ZipCode MailZipCod, OCPR.Name Attn, OCPR.Position Department, OCPR.Address As CntctAddrs, OCRD.Block MailBlock, OCST.Name MailState, OCRY.Name MailCountry FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode )"
-              " LEFT JOIN OCRY ON (OCRY.Code = OCRD.Country) LEFT JOIN OCST ON (OCST.Code = OCRD.State1 AND OCST.Country = OCRD.Country)"_s);
+    EXPECT_EQ(
+        BuildSelect(c, 1, 0, true, kLetters),
+        u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Address MailAddres, OCRD.County MailCounty, OCRD.City "
+        u"MailCity, OCRD.ZipCode MailZipCod, OCPR.Name Attn, OCPR.Position Department, OCPR.Address As CntctAddrs, "
+        u"OCRD.Block MailBlock, OCST.Name MailState, OCRY.Name MailCountry FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode "
+        u"= OCRD.CardCode )"
+        " LEFT JOIN OCRY ON (OCRY.Code = OCRD.Country) LEFT JOIN OCST ON (OCST.Code = OCRD.State1 AND OCST.Country = OCRD.Country)"_s);
 
     MailingOptions checks;
     checks.dates = true;
@@ -156,8 +265,9 @@ TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
     checks.docType = 6;
     checks.addressBySql = true;
     checks.sqlAddress = u"OCRD.Notes"_s;
-    EXPECT_EQ(BuildSelect(checks, -1, 6, true, kLabels),
-              u"SELECT DISTINCT OCRD.CardCode, OCHO.VendorName As CardName, OCRD.Notes As MailAddres, '' MailCounty, '' MailCity, '' MailZipCod, OCPR.Name Attn, OCPR.Notes1 Department, OCPR.Address As CntctAddrs FROM (OCRD INNER JOIN OCHO ON OCRD.CardCode = OCHO.VendorCode) LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn)"_s);
+    EXPECT_EQ(
+        BuildSelect(checks, -1, 6, true, kLabels),
+        u"SELECT DISTINCT OCRD.CardCode, OCHO.VendorName As CardName, OCRD.Notes As MailAddres, '' MailCounty, '' MailCity, '' MailZipCod, OCPR.Name Attn, OCPR.Notes1 Department, OCPR.Address As CntctAddrs FROM (OCRD INNER JOIN OCHO ON OCRD.CardCode = OCHO.VendorCode) LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn)"_s);
     checks.sortBy = 1;
     EXPECT_EQ(BuildOrderBy(checks, -1, 6, kLabels), u" ORDER BY OCHO.VendorName ASC"_s)
         << "the name key is the column the list takes the name from";
@@ -165,8 +275,9 @@ TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
     MailingOptions fax;
     fax.faxField[4] = true;
     fax.faxExpr[4] = u"OCRD.Phone2"_s;
-    EXPECT_EQ(BuildSelect(fax, 1, 0, false, kFax),
-              u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Fax, OCRD.Phone1, OCPR.Name AS Attn, OCPR.Name AS CName, OCPR.Fax AS CFax, OCPR.Position, OCPR.Notes1, OCPR.Notes2, OCRD.Phone2 As Field4 FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
+    EXPECT_EQ(
+        BuildSelect(fax, 1, 0, false, kFax),
+        u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName, OCRD.Fax, OCRD.Phone1, OCPR.Name AS Attn, OCPR.Name AS CName, OCPR.Fax AS CFax, OCPR.Position, OCPR.Notes1, OCPR.Notes2, OCRD.Phone2 As Field4 FROM OCRD LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
     EXPECT_FALSE(BuildSelect(fax, 1, 0, false, kEmail).contains(u"Field4"_s));
     EXPECT_TRUE(BuildSelect(MailingOptions{}, 1, 0, false, 7).startsWith(u" FROM OCRD"_s));
 }
@@ -183,7 +294,8 @@ TEST(StatementText, ASortKeyOutsideTheListIsSelectedSoTheDatabaseAcceptsTheOrder
 
     c.sortBy = 5;
     c.sortDir = -1;
-    EXPECT_TRUE(BuildSelect(c, 1, 0, true, kLabels).contains(u", OCPR.Cellolar AS SortKey1, OCRD.Cellular AS SortKey2 FROM"_s));
+    EXPECT_TRUE(
+        BuildSelect(c, 1, 0, true, kLabels).contains(u", OCPR.Cellolar AS SortKey1, OCRD.Cellular AS SortKey2 FROM"_s));
     EXPECT_EQ(BuildOrderBy(c, 1, 0, kLabels), u" ORDER BY SortKey1 , SortKey2 "_s);
     EXPECT_EQ(BuildOrderBy(c, 1, 0, kMobiles), u" ORDER BY OCPR.Cellolar , OCRD.Cellular "_s);
 }

@@ -18,7 +18,8 @@ QString insertRow(const QString& table, const QVariantMap& values)
         else if (value.typeId() == QMetaType::QDate)
             literals << QStringLiteral("'%1'").arg(value.toDate().toString(Qt::ISODate));
         else
-            literals << QStringLiteral("'") + value.toString().replace(QStringLiteral("'"), QStringLiteral("''")) + QStringLiteral("'");
+            literals << QStringLiteral("'") + value.toString().replace(QStringLiteral("'"), QStringLiteral("''"))
+                    + QStringLiteral("'");
     }
     return QStringLiteral("INSERT INTO %1 (%2) VALUES (%3)")
         .arg(table, tableNamed(table).columns.join(QStringLiteral(", ")), literals.join(QStringLiteral(", ")));
@@ -27,9 +28,10 @@ QString insertRow(const QString& table, const QVariantMap& values)
 QStringList handMadeCompany(int version, const QStringList& rows)
 {
     return createStatements(companyTables())
-           + QStringList{insertRow(QStringLiteral("CINF"), {{QStringLiteral("CompnyName"), QStringLiteral("Test")},
-                                                             {QStringLiteral("Version"), version}})}
-           + rows;
+        + QStringList{insertRow(
+            QStringLiteral("CINF"),
+            {{QStringLiteral("CompnyName"), QStringLiteral("Test")}, {QStringLiteral("Version"), version}})}
+    + rows;
 }
 
 }  // namespace pelmar::test

@@ -44,7 +44,8 @@ public:
             QSqlQuery query(db);
             for (const QString& statement : statements) {
                 if (!query.exec(statement))
-                    throw std::runtime_error((statement + QStringLiteral(": ") + query.lastError().text()).toStdString());
+                    throw std::runtime_error(
+                        (statement + QStringLiteral(": ") + query.lastError().text()).toStdString());
             }
             db.commit();
         }
@@ -103,8 +104,9 @@ private:
         QTemporaryDir files;
         PgCopyWriter writer(files.path());
         fill(writer);
-        cluster_.createDatabase(database, createStatements(tables) + writer.finish() + indexStatements(tables)
-                                              + QStringList{QStringLiteral("ANALYZE")});
+        cluster_.createDatabase(database,
+                                createStatements(tables) + writer.finish() + indexStatements(tables)
+                                    + QStringList{QStringLiteral("ANALYZE")});
     }
 
     PgCluster& cluster_;

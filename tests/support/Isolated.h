@@ -1,9 +1,9 @@
 #pragma once
 
+#include "support/QtPrinting.h"
+
 #include <QString>
 #include <QTemporaryDir>
-
-#include "support/QtPrinting.h"
 
 #include <gtest/gtest.h>
 

@@ -11,10 +11,9 @@
 #include <netinet/in.h>
 #include <pwd.h>
 #include <signal.h>
+#include <stdexcept>
 #include <sys/socket.h>
 #include <unistd.h>
-
-#include <stdexcept>
 
 namespace pelmar::test {
 
@@ -27,8 +26,8 @@ bool runningAsRoot()
 
 QString postgresBin()
 {
-    const QStringList versions = QDir(QStringLiteral("/usr/lib/postgresql")).entryList(QDir::Dirs | QDir::NoDotAndDotDot,
-                                                                                     QDir::Name | QDir::Reversed);
+    const QStringList versions = QDir(QStringLiteral("/usr/lib/postgresql"))
+                                     .entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name | QDir::Reversed);
     if (versions.isEmpty())
         throw std::runtime_error("PostgreSQL is not installed (no /usr/lib/postgresql/<version>)");
     return QStringLiteral("/usr/lib/postgresql/%1/bin").arg(versions.first());
@@ -39,8 +38,9 @@ QStringList asOwner(const QString& program, const QStringList& arguments)
 {
     if (!runningAsRoot())
         return QStringList{program} + arguments;
-    return QStringList{QStringLiteral("runuser"), QStringLiteral("-u"), QStringLiteral("postgres"), QStringLiteral("--"),
-                       program} + arguments;
+    return QStringList{QStringLiteral("runuser"), QStringLiteral("-u"), QStringLiteral("postgres"),
+                       QStringLiteral("--"), program}
+    + arguments;
 }
 
 void run(const QStringList& command, int timeoutMs = 120000)
@@ -49,7 +49,8 @@ void run(const QStringList& command, int timeoutMs = 120000)
     process.setProcessChannelMode(QProcess::MergedChannels);
     process.start(command.first(), command.mid(1));
     if (!process.waitForFinished(timeoutMs) || process.exitStatus() != QProcess::NormalExit || process.exitCode() != 0)
-        throw std::runtime_error("command failed: " + command.join(QLatin1Char(' ')).toStdString() + "\n" + process.readAll().toStdString());
+        throw std::runtime_error("command failed: " + command.join(QLatin1Char(' ')).toStdString() + "\n"
+                                 + process.readAll().toStdString());
 }
 
 void giveToOwner(const QString& path)
@@ -109,9 +110,10 @@ PgCluster::PgCluster() : dir_(QDir::tempPath() + QStringLiteral("/pelmar-pg-XXXX
 {
     if (!dir_.isValid())
         throw std::runtime_error("cannot create the cluster folder");
-    QFile::setPermissions(dir_.path(), QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner
-                                          | QFileDevice::ReadOther | QFileDevice::ExeOther | QFileDevice::ReadGroup
-                                          | QFileDevice::ExeGroup);
+    QFile::setPermissions(dir_.path(),
+                          QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner
+                              | QFileDevice::ReadOther | QFileDevice::ExeOther | QFileDevice::ReadGroup
+                              | QFileDevice::ExeGroup);
     port_ = freeLoopbackPort();
     initialise();
     start();
@@ -147,13 +149,16 @@ void PgCluster::initialise()
 void PgCluster::start()
 {
     const QString data = dir_.filePath(QStringLiteral("data"));
-    const QString script = QStringLiteral(
-        "\"%1/postgres\" -D \"%2\" -p %3 -k \"%2\" -c listen_addresses=127.0.0.1 -c fsync=off "
-        "-c synchronous_commit=off -c full_page_writes=off -c max_connections=60 >\"%2/server.log\" 2>&1 &\n"
-        "pg=$!\n"
-        "while [ -d /proc/%4 ] && kill -0 $pg 2>/dev/null; do sleep 1; done\n"
-        "kill -INT $pg 2>/dev/null\n")
-        .arg(bin_, data).arg(port_).arg(QCoreApplication::applicationPid());
+    const QString script
+        = QStringLiteral(
+              "\"%1/postgres\" -D \"%2\" -p %3 -k \"%2\" -c listen_addresses=127.0.0.1 -c fsync=off "
+              "-c synchronous_commit=off -c full_page_writes=off -c max_connections=60 >\"%2/server.log\" 2>&1 &\n"
+              "pg=$!\n"
+              "while [ -d /proc/%4 ] && kill -0 $pg 2>/dev/null; do sleep 1; done\n"
+              "kill -INT $pg 2>/dev/null\n")
+              .arg(bin_, data)
+              .arg(port_)
+              .arg(QCoreApplication::applicationPid());
     const QStringList command = asOwner(QStringLiteral("/bin/sh"), {QStringLiteral("-c"), script});
     if (!QProcess::startDetached(command.first(), command.mid(1)))
         throw std::runtime_error("cannot start the PostgreSQL server");
@@ -166,8 +171,8 @@ void PgCluster::waitUntilReady()
     while (timer.elapsed() < 60000) {
         QProcess ready;
         ready.start(bin_ + QStringLiteral("/pg_isready"),
-                    {QStringLiteral("-q"), QStringLiteral("-h"), dir_.filePath(QStringLiteral("data")), QStringLiteral("-p"),
-                     QString::number(port_)});
+                    {QStringLiteral("-q"), QStringLiteral("-h"), dir_.filePath(QStringLiteral("data")),
+                     QStringLiteral("-p"), QString::number(port_)});
         ready.waitForFinished();
         if (ready.exitCode() == 0)
             return;
@@ -198,7 +203,8 @@ void PgCluster::psql(const QString& database, const QStringList& arguments)
     run(QStringList{bin_ + QStringLiteral("/psql"), QStringLiteral("-X"), QStringLiteral("-q"), QStringLiteral("-v"),
                     QStringLiteral("ON_ERROR_STOP=1"), QStringLiteral("-h"), dir_.filePath(QStringLiteral("data")),
                     QStringLiteral("-p"), QString::number(port_), QStringLiteral("-U"), QStringLiteral("postgres"),
-                    QStringLiteral("-d"), database} + arguments);
+                    QStringLiteral("-d"), database}
+        + arguments);
 }
 
 void PgCluster::runAsSuperuser(const QString& database, const QString& sql)

@@ -51,7 +51,8 @@ QStringList PgCopyWriter::finish()
     QStringList commands;
     for (auto it = files_.begin(); it != files_.end(); ++it) {
         it.value()->close();
-        commands << QStringLiteral("\\copy %1 (%2) from '%3'").arg(it.key(), columns_[it.key()], it.value()->fileName());
+        commands
+            << QStringLiteral("\\copy %1 (%2) from '%3'").arg(it.key(), columns_[it.key()], it.value()->fileName());
     }
     return commands;
 }

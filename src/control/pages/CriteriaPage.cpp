@@ -1,7 +1,7 @@
 #include "control/MainCardControls.h"
-#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
 #include "options/Lists.h"
+#include "widgets/Widgets.h"
 
 #include <QCheckBox>
 #include <QComboBox>

@@ -1,6 +1,6 @@
 #include "control/MainCardControls.h"
-#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
+#include "widgets/Widgets.h"
 
 #include <QButtonGroup>
 #include <QGridLayout>
@@ -72,8 +72,8 @@ QGroupBox* buildRecipients()
     QGridLayout* grid = nullptr;
     QGroupBox* group = groupBox(u"נמענים"_s, grid);
     auto* methods = new QButtonGroup(group);
-    QRadioButton* OptEmailMethod[] = {nullptr, new QRadioButton(u"דיוור נפרד לכל נמען"_s),
-                                      new QRadioButton(u"דיוור בקבוצות של "_s)};
+    QRadioButton* OptEmailMethod[]
+        = {nullptr, new QRadioButton(u"דיוור נפרד לכל נמען"_s), new QRadioButton(u"דיוור בקבוצות של "_s)};
     for (int i = 1; i <= 2; ++i) {
         OptEmailMethod[i]->setObjectName(arrayName("OptEmailMethod", i));
         methods->addButton(OptEmailMethod[i], i);

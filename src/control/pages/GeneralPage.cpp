@@ -1,7 +1,7 @@
-#include "widgets/ClickableLabel.h"
 #include "control/MainCardControls.h"
-#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
+#include "widgets/ClickableLabel.h"
+#include "widgets/Widgets.h"
 
 #include <QPushButton>
 #include <QVBoxLayout>

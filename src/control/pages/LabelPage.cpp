@@ -1,8 +1,8 @@
-#include "widgets/ClickableLabel.h"
 #include "control/MainCardControls.h"
-#include "widgets/Widgets.h"
 #include "control/pages/Pages.h"
 #include "options/Lists.h"
+#include "widgets/ClickableLabel.h"
+#include "widgets/Widgets.h"
 
 #include <QCheckBox>
 #include <QComboBox>

@@ -1,13 +1,13 @@
-#include "settings/SettingsStore.h"
 #include "db/ui/LogonDialog.h"
 
 #include "common/Failure.h"
 #include "common/Messages.h"
 #include "common/SessionState.h"
-#include "widgets/SetGetCtrl.h"
-#include "widgets/Widgets.h"
 #include "db/CompanyList.h"
 #include "db/DatabaseClient.h"
+#include "settings/SettingsStore.h"
+#include "widgets/SetGetCtrl.h"
+#include "widgets/Widgets.h"
 
 #include <QComboBox>
 #include <QGridLayout>
@@ -113,8 +113,8 @@ void LogonDialog::CmdCheck_Click()
     repaint();
     for (const QString& database : databasesToCheck(txtConnDatabase->text())) {
         try {
-            checkCompanyDatabase(services_.database, txtConnServer->text(), txtConnUID->text(),
-                                 txtConnPWD->text(), database);
+            checkCompanyDatabase(services_.database, txtConnServer->text(), txtConnUID->text(), txtConnPWD->text(),
+                                 database);
         } catch (const Failure& failure) {
             LblMsg->setText(u"הבדיקה לא הסתיימה בהצלחה"_s);
             services_.messages.critical(u"תקלה"_s, failure.description());

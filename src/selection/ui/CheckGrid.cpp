@@ -1,7 +1,7 @@
 #include "selection/ui/CheckGrid.h"
 
-#include "widgets/Widgets.h"
 #include "selection/CheckListModel.h"
+#include "widgets/Widgets.h"
 
 #include <QHeaderView>
 #include <QPushButton>

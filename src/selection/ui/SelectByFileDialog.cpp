@@ -1,14 +1,14 @@
-#include "settings/SettingsStore.h"
 #include "selection/ui/SelectByFileDialog.h"
 
 #include "common/Failure.h"
 #include "common/FileDialogs.h"
 #include "common/Messages.h"
 #include "common/SessionState.h"
-#include "widgets/SetGetCtrl.h"
-#include "widgets/Widgets.h"
 #include "selection/PickerData.h"
 #include "selection/SelectedCards.h"
+#include "settings/SettingsStore.h"
+#include "widgets/SetGetCtrl.h"
+#include "widgets/Widgets.h"
 
 #include <QApplication>
 #include <QCheckBox>
@@ -76,10 +76,10 @@ void SelectByFileDialog::buildControls()
 
 void SelectByFileDialog::SetGetImportParams(unsigned char action)
 {
-    const QList<std::tuple<QString, QObject*, unsigned char, QString>> keys = {
-        {u"FileName"_s, txtFileName, kPropText, u"c:\\results.txt"_s},
-        {u"TabNum"_s, txtTabNum, kPropText, u"2"_s},
-        {u"IgnoreFirstLine"_s, ChkIgnoreFirstLine, kPropValue, u"1"_s}};
+    const QList<std::tuple<QString, QObject*, unsigned char, QString>> keys
+        = {{u"FileName"_s, txtFileName, kPropText, u"c:\\results.txt"_s},
+           {u"TabNum"_s, txtTabNum, kPropText, u"2"_s},
+           {u"IgnoreFirstLine"_s, ChkIgnoreFirstLine, kPropValue, u"1"_s}};
     for (const auto& [key, control, prop, fallback] : keys) {
         try {
             SetGetCtrl(action, services_.settings, kPelmarApp, u"ImportFile"_s, key, control, prop, fallback);
@@ -110,7 +110,8 @@ bool SelectByFileDialog::ReadCardsFromFile()
     }
     fileCrd_.clear();
     try {
-        fileCrd_ = readCardFile(txtFileName->text(), cardFileColumn(txtTabNum->text()), ChkIgnoreFirstLine->isChecked());
+        fileCrd_
+            = readCardFile(txtFileName->text(), cardFileColumn(txtTabNum->text()), ChkIgnoreFirstLine->isChecked());
     } catch (const Failure& failure) {
         services_.messages.critical(u"תקלה"_s, failure.description());
         Msg1->setText(u"תקלה בקריאת הקובץ"_s);

@@ -3,10 +3,10 @@
 #include "common/Failure.h"
 #include "common/Messages.h"
 #include "common/SessionState.h"
-#include "widgets/Widgets.h"
 #include "selection/PickerData.h"
 #include "selection/SelectedCards.h"
 #include "selection/ui/CheckGrid.h"
+#include "widgets/Widgets.h"
 
 #include <QApplication>
 #include <QGridLayout>
@@ -42,9 +42,10 @@ public:
 
 }  // namespace
 
-SelectCardDialog::SelectCardDialog(Services services, SessionState& state, std::function<void(const QString&)> openCardPage,
-                                   QWidget* parent)
-    : QDialog(parent), model({u"קוד כרטיס"_s, u"להדפיס"_s, u"שם כרטיס"_s}, {kCodeText, CheckListModel::kCheckColumn, kNameText}),
+SelectCardDialog::SelectCardDialog(Services services, SessionState& state,
+                                   std::function<void(const QString&)> openCardPage, QWidget* parent)
+    : QDialog(parent),
+      model({u"קוד כרטיס"_s, u"להדפיס"_s, u"שם כרטיס"_s}, {kCodeText, CheckListModel::kCheckColumn, kNameText}),
       services_(services), state_(state), openCardPage_(std::move(openCardPage))
 {
     setObjectName(u"frmSelectCard"_s);
@@ -62,9 +63,9 @@ void SelectCardDialog::buildControls()
     txtToItemkey = textBox(u"txtToItemkey"_s);
     txtToItemName = textBox(u"txtToItemName"_s);
     auto* find = new QGridLayout;
-    const QList<std::tuple<QString, QString, QLineEdit*, void (SelectCardDialog::*)()>> searches = {
-        {u"cmdFindKey"_s, u"איתור כרטיס לפי קוד:"_s, txtToItemkey, &SelectCardDialog::cmdFindKey_Click},
-        {u"cmdFindByDesc"_s, u"איתור כרטיס לפי תאור:"_s, txtToItemName, &SelectCardDialog::cmdFindByDesc_Click}};
+    const QList<std::tuple<QString, QString, QLineEdit*, void (SelectCardDialog::*)()>> searches
+        = {{u"cmdFindKey"_s, u"איתור כרטיס לפי קוד:"_s, txtToItemkey, &SelectCardDialog::cmdFindKey_Click},
+           {u"cmdFindByDesc"_s, u"איתור כרטיס לפי תאור:"_s, txtToItemName, &SelectCardDialog::cmdFindByDesc_Click}};
     int row = 0;
     for (const auto& [name, text, box, handler] : searches) {
         QPushButton* search = button(name, text);
@@ -73,13 +74,13 @@ void SelectCardDialog::buildControls()
         find->addWidget(box, row++, 1);
     }
     auto* buttons = new QHBoxLayout;
-    const QList<std::tuple<QString, QString, void (SelectCardDialog::*)()>> actions = {
-        {u"CmdAllItems"_s, u"סמן את כולם"_s, &SelectCardDialog::CmdAllItems_Click},
-        {u"cmdNoneItems"_s, u"בטל את כולם"_s, &SelectCardDialog::cmdNoneItems_Click},
-        {u"cmdShowMarked"_s, u"סדר לפי סימון"_s, &SelectCardDialog::cmdShowMarked_Click},
-        {u"cmdShowAll"_s, u"סדר לפי שם"_s, &SelectCardDialog::cmdShowAll_Click},
-        {u"cmdOK"_s, u"אישור"_s, &SelectCardDialog::cmdOK_Click},
-        {u"cmdClose"_s, u"ביטול"_s, &SelectCardDialog::cmdClose_Click}};
+    const QList<std::tuple<QString, QString, void (SelectCardDialog::*)()>> actions
+        = {{u"CmdAllItems"_s, u"סמן את כולם"_s, &SelectCardDialog::CmdAllItems_Click},
+           {u"cmdNoneItems"_s, u"בטל את כולם"_s, &SelectCardDialog::cmdNoneItems_Click},
+           {u"cmdShowMarked"_s, u"סדר לפי סימון"_s, &SelectCardDialog::cmdShowMarked_Click},
+           {u"cmdShowAll"_s, u"סדר לפי שם"_s, &SelectCardDialog::cmdShowAll_Click},
+           {u"cmdOK"_s, u"אישור"_s, &SelectCardDialog::cmdOK_Click},
+           {u"cmdClose"_s, u"ביטול"_s, &SelectCardDialog::cmdClose_Click}};
     for (const auto& [name, text, handler] : actions) {
         QPushButton* action = button(name, text);
         connect(action, &QPushButton::clicked, this, handler);

@@ -15,7 +15,10 @@ namespace {
 
 class LabelStyles : public Isolated {
 protected:
-    QString key(int line, const QString& name) { return store.value(u"Pelmar"_s, u"LabelDef"_s + QString::number(line), name, u"<none>"_s); }
+    QString key(int line, const QString& name)
+    {
+        return store.value(u"Pelmar"_s, u"LabelDef"_s + QString::number(line), name, u"<none>"_s);
+    }
     SettingsStore store{path(u"config/Pelmar"_s)};
     LabelDefTable defs{};
 };

@@ -1,4 +1,5 @@
 #include "common/Failure.h"
+#include "options/MailingOptions.h"
 #include "selection/PickerData.h"
 #include "selection/WhereBuilder.h"
 #include "selection/ui/GroupPickers.h"
@@ -6,7 +7,6 @@
 #include "selection/ui/SelectCardDialog.h"
 #include "support/CompanyRows.h"
 #include "support/Engines.h"
-#include "options/MailingOptions.h"
 #include "support/ui/ModalCloser.h"
 #include "support/ui/WindowFixture.h"
 
@@ -77,7 +77,8 @@ TEST_F(PickersTest, AChoiceComesBackOnReopeningAndCancelKeepsTheStoredOne)
     }
     MailingOptions customers;
     customers.catCode = true;
-    EXPECT_EQ(BuildWhere(customers, state), u" Where (1 > 0) AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s);
+    EXPECT_EQ(BuildWhere(customers, state),
+              u" Where (1 > 0) AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s);
     {
         CardGroupDialog dialog(services(), state, conn());
         EXPECT_EQ(dialog.model.checkedKeys(), (QStringList{u"100"_s, u"103"_s}));
@@ -98,7 +99,8 @@ TEST_F(PickersTest, AChoiceComesBackOnReopeningAndCancelKeepsTheStoredOne)
     suppliers.cardType = 1;
     EXPECT_EQ(BuildWhere(suppliers, state), u" Where (1 > 0) AND OCRD.CardType = 'S'"_s);
 
-    state.SelCardGroups = {CardGroupSel{}, {100, false}, {101, false}, {102, false}, {103, false}, {104, false}, {199, true}};
+    state.SelCardGroups
+        = {CardGroupSel{}, {100, false}, {101, false}, {102, false}, {103, false}, {104, false}, {199, true}};
     state.GroupCardType = 1;
     CardGroupDialog supplierGroups(services(), state, conn());
     EXPECT_EQ(state.SelCardGroups.size(), 5) << "the selection is cut to the rows of the list";
@@ -147,16 +149,19 @@ TEST_F(PickersTest, PropertiesListAllSixtyFourAndTheRelationComesBack)
 
 TEST_F(PickersTest, TheCardPickerListsSearchesSortsAndStoresTheCheckedCodesInGridOrder)
 {
-    engine->createDatabase(u"cards"_s, handMadeCompany(900000, {
-        insertRow(u"OCRD"_s, {{u"CardCode"_s, u"C003"_s}, {u"CardName"_s, u"gamma"_s}}),
-        insertRow(u"OCRD"_s, {{u"CardCode"_s, u"   "_s}, {u"CardName"_s, u"no code"_s}}),
-        insertRow(u"OCRD"_s, {{u"CardCode"_s, u"C001"_s}, {u"CardName"_s, u"Beta"_s}}),
-        insertRow(u"OCRD"_s, {{u"CardCode"_s, u"C002"_s}, {u"CardName"_s, u""_s}}),
-        insertRow(u"OCRD"_s, {{u"CardCode"_s, u"c004"_s}, {u"CardName"_s, u"alpha"_s}}),
-        insertRow(u"OCRD"_s, {{u"CardCode"_s, u"C005"_s}, {u"CardName"_s, u"אלף"_s}})}));
+    engine->createDatabase(
+        u"cards"_s,
+        handMadeCompany(900000,
+                        {insertRow(u"OCRD"_s, {{u"CardCode"_s, u"C003"_s}, {u"CardName"_s, u"gamma"_s}}),
+                         insertRow(u"OCRD"_s, {{u"CardCode"_s, u"   "_s}, {u"CardName"_s, u"no code"_s}}),
+                         insertRow(u"OCRD"_s, {{u"CardCode"_s, u"C001"_s}, {u"CardName"_s, u"Beta"_s}}),
+                         insertRow(u"OCRD"_s, {{u"CardCode"_s, u"C002"_s}, {u"CardName"_s, u""_s}}),
+                         insertRow(u"OCRD"_s, {{u"CardCode"_s, u"c004"_s}, {u"CardName"_s, u"alpha"_s}}),
+                         insertRow(u"OCRD"_s, {{u"CardCode"_s, u"C005"_s}, {u"CardName"_s, u"אלף"_s}})}));
     QStringList opened;
     SelectCardDialog picker(services(), state, [&](const QString& code) { opened << code; });
-    picker.FillCardList(engine->connString(u"cards"_s), u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName FROM OCRD ORDER BY CardCode"_s);
+    picker.FillCardList(engine->connString(u"cards"_s),
+                        u"SELECT DISTINCT OCRD.CardCode, OCRD.CardName FROM OCRD ORDER BY CardCode"_s);
     EXPECT_EQ(texts(picker.model), (QStringList{u"C001"_s, u"C002"_s, u"C003"_s, u"C005"_s, u"c004"_s}));
     EXPECT_EQ(picker.model.row(1).texts[1], u"-"_s);
 
@@ -199,7 +204,8 @@ TEST_F(PickersTest, NoToTheRescanQuestionKeepsThePickerAndItsMarks)
 
     messages.answers = {false};
     card->cmdSelectAccount_Click();
-    EXPECT_EQ(messages.boxes.back(), (FakeMessages::Box{u"question"_s, u"שימו לב"_s, u"לסרוק מחדש את רשימת הכרטיסים?"_s}));
+    EXPECT_EQ(messages.boxes.back(),
+              (FakeMessages::Box{u"question"_s, u"שימו לב"_s, u"לסרוק מחדש את רשימת הכרטיסים?"_s}));
     EXPECT_EQ(card->cardPicker(), first);
     EXPECT_EQ(card->cardPicker()->model.checkedKeys().size(), 1);
 
@@ -238,7 +244,8 @@ TEST_F(CardFileTest, TheDialogReadsCountsAndCopiesOnOkWithItsOptionsSaved)
     EXPECT_EQ(files.calls.last().filter, u"Excel Text Files (*.txt)|*.txt|All Files (*.*)|*.*"_s);
     dialog.cmdReadFile_Click();
     EXPECT_EQ(dialog.Msg1->text(), u"קריאת הקובץ הסתיימה בהצלחה. נמצאו 10 כרטיסים"_s);
-    EXPECT_EQ(messages.boxes.last(), (FakeMessages::Box{u"information"_s, u"הודעה"_s, u"קריאת הקובץ הסתיימה בהצלחה"_s}));
+    EXPECT_EQ(messages.boxes.last(),
+              (FakeMessages::Box{u"information"_s, u"הודעה"_s, u"קריאת הקובץ הסתיימה בהצלחה"_s}));
 
     dialog.txtTabNum->setText(u"x"_s);
     dialog.cmdReadFile_Click();
