@@ -6,7 +6,10 @@
 #include <QApplication>
 #include <QDir>
 #include <QFile>
+#include <QLibraryInfo>
+#include <QLocale>
 #include <QMainWindow>
+#include <QTranslator>
 
 #include <unistd.h>
 
@@ -33,11 +36,22 @@ void ensureRuntimeFolder()
     qputenv("XDG_RUNTIME_DIR", folder.toLocal8Bit());
 }
 
+// Qt's own texts (the buttons of the message boxes, the file dialogs) in Hebrew, from Qt's
+// translations (Debian's qt6-translations-l10n); without them they stay in English.
+void translateQt(QTranslator& translator)
+{
+    if (translator.load(QLocale(QLocale::Hebrew), u"qtbase"_s, u"_"_s,
+                        QLibraryInfo::path(QLibraryInfo::TranslationsPath)))
+        QCoreApplication::installTranslator(&translator);
+}
+
 // The window: the mailing control on a host window titled "Pelmar".
 int runWindow(int argc, char* argv[])
 {
     QApplication app(argc, argv);
     nameTheApplication();
+    QTranslator translator;
+    translateQt(translator);
     QApplication::setLayoutDirection(Qt::RightToLeft);
     pelmar::RealServices real;
     pelmar::SessionState state;
