@@ -1,21 +1,12 @@
 #include "outputs/LabelStyles.h"
-#include "settings/SettingsStore.h"
-#include "support/Isolated.h"
+#include "support/LabelStyleStore.h"
 
 using namespace Qt::StringLiterals;
 
 namespace pelmar::test {
 namespace {
 
-class LabelStyles : public Isolated {
-protected:
-    QString key(int line, const QString& name)
-    {
-        return store.value(u"Pelmar"_s, u"LabelDef"_s + QString::number(line), name, u"<none>"_s);
-    }
-    SettingsStore store{path(u"config/Pelmar"_s)};
-    LabelDefTable defs{};
-};
+using LabelStyles = LabelStyleStore;
 
 TEST_F(LabelStyles, FreshSettingsGiveArialNinePointsForEveryLine)
 {
