@@ -52,13 +52,27 @@ QSqlQuery& SqliteCompanyWriter::insertFor(const TableSchema& table)
 }
 
 // Dates are stored as ISO text, the form the embedded engine compares correctly.
+namespace {
+
+// A value as the embedded engine stores it: a date as ISO text, and an empty text as empty text
+// (the driver would take an empty QString for Null, which the row does not mean).
+QVariant stored(const QVariant& value)
+{
+    if (value.typeId() == QMetaType::QDate)
+        return value.toDate().toString(Qt::ISODate);
+    if (!value.isNull() && value.typeId() == QMetaType::QString && value.toString().isEmpty())
+        return QString(u""_s);
+    return value;
+}
+
+}  // namespace
+
 void SqliteCompanyWriter::add(const TableSchema& table, const QVariantList& values)
 {
     QSqlQuery& insert = insertFor(table);
     for (int i = 0; i < values.size(); ++i) {
         const QVariant& value = values.at(i);
-        insert.bindValue(i,
-                         value.typeId() == QMetaType::QDate ? QVariant(value.toDate().toString(Qt::ISODate)) : value);
+        insert.bindValue(i, stored(value));
     }
     if (!insert.exec())
         throw failureOf(insert.lastError());
