@@ -1,6 +1,7 @@
 #include "db/ConnString.h"
 #include "db/ConnectionTarget.h"
 #include "support/QtPrinting.h"
+#include "support/FailureOf.h"
 
 #include <gtest/gtest.h>
 
@@ -74,6 +75,10 @@ TEST(ConnectionTarget, EveryKindBecomesAnOdbcStringThatQuotesWhatNeedsIt)
         {BuildConnString(u"db\\SQL2019"_s, u"sa"_s, u"pw"_s, u".SBO"_s), u"ODBC Driver 17 for SQL Server"_s,
          u"DRIVER={ODBC Driver 17 for SQL Server};SERVER=db\\SQL2019;DATABASE=SBO;UID=sa;PWD=pw"_s},
         {BuildConnString(u"MyDsn"_s, u"u=1"_s, u"pw"_s, u""_s), pg, u"DSN=MyDsn;UID={u=1};PWD=pw"_s},
+        {BuildConnString(u"db"_s, u"sa"_s, u" pw "_s, u"SBO"_s), u"FreeTDS"_s,
+         u"DRIVER={FreeTDS};SERVER=db;DATABASE=SBO;UID=sa;PWD={ pw };TDS_Version=7.4;ClientCharset=UTF-8"_s},
+        {BuildConnString(u"db"_s, u"sa"_s, u"{pw"_s, u"SBO"_s), u"FreeTDS"_s,
+         u"DRIVER={FreeTDS};SERVER=db;DATABASE=SBO;UID=sa;PWD={{pw};TDS_Version=7.4;ClientCharset=UTF-8"_s},
     };
     for (const TargetCase& c : cases)
         EXPECT_EQ(ConnectionTarget::parse(c.connString).odbcString(c.driver), c.odbc) << c.connString.toStdString();
@@ -88,8 +93,10 @@ TEST(ConnectionTarget, ASqliteServerNamesTheEmbeddedFolder)
 
 TEST(ConnectionTarget, AStringOfNoKnownKindIsRefused)
 {
-    EXPECT_ANY_THROW(ConnectionTarget::parse(QString()));
-    EXPECT_ANY_THROW(ConnectionTarget::parse(u"Server=x;Database=y"_s));
+    for (const QString& text : {QString(), u"Server=x;Database=y"_s, u"Provider=sqloledb;Data Source=x"_s})
+        EXPECT_EQ(failureOf([&] { ConnectionTarget::parse(text); }),
+                  u"The connection string is not of a kind this program can open."_s)
+            << text.toStdString();
 }
 
 }  // namespace

@@ -18,6 +18,9 @@ TEST(SqliteLiterals, NationalTextAndUsDatesAreRewrittenAndNothingElse)
         {u"x = '3/1/2005' OR y = '03/01/2005 '"_s, u"x = '3/1/2005' OR y = '03/01/2005 '"_s},
         {u"\"N'a'\" = [N'b']"_s, u"\"N'a'\" = [N'b']"_s},
         {u"n'lower'"_s, u"'lower'"_s},
+        {u"x = 'a''03/01/2005'"_s, u"x = 'a''03/01/2005'"_s},
+        {u"x = '03/01/2005''' OR '12/31/1999'"_s, u"x = '03/01/2005''' OR '1999-12-31'"_s},
+        {u"[a]]N'b] = N'c'"_s, u"[a]]N'b] = 'c'"_s},
     };
     for (const auto& [sql, expected] : cases)
         EXPECT_EQ(adaptLiteralsForSqlite(sql), expected) << sql.toStdString();

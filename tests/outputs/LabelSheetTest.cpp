@@ -5,6 +5,7 @@
 #include "outputs/LabelStyles.h"
 #include "outputs/Runs.h"
 #include "support/LabelCompany.h"
+#include "support/FailureOf.h"
 
 #include <QFile>
 #include <QRegularExpression>
@@ -52,12 +53,18 @@ protected:
     }
 };
 
-const QString kHead
-    = u"<HTML>\r\n<HEAD>\r\n<TITLE>טרבל מערכות מידע מציגה</TITLE>\r\n"
-      "<meta http-equiv='Content-Type' content='text/html; charset=windows-1255'>\r\n<style>\r\n"
-      " TR {vertical-align: middle; text-align: right}\r\n TD {vertical-align: middle}\r\n"
-      " .TDL {; height: 33.3%; width: 50.0%; vertical-align: middle; text-align: center}\r\n"
-      " .TBL1 {padding: 1; border-spacing: 0; border-collapse: collapse; border: none; direction: rtl}\r\n"_s;
+// The head of a sheet up to its line styles, for cells of the given height and width.
+QString headOf(const QString& height, const QString& width)
+{
+    return u"<HTML>\r\n<HEAD>\r\n<TITLE>טרבל מערכות מידע מציגה</TITLE>\r\n"
+           "<meta http-equiv='Content-Type' content='text/html; charset=windows-1255'>\r\n<style>\r\n"
+           " TR {vertical-align: middle; text-align: right}\r\n TD {vertical-align: middle}\r\n"
+           " .TDL {; height: %1%; width: %2%; vertical-align: middle; text-align: center}\r\n"
+           " .TBL1 {padding: 1; border-spacing: 0; border-collapse: collapse; border: none; direction: rtl}\r\n"_s
+        .arg(height, width);
+}
+
+const QString kHead = headOf(u"33.3"_s, u"50.0"_s);
 
 QString rulesOf(int line)
 {
@@ -105,6 +112,33 @@ TEST_F(LabelSheet, ASheetIsWrittenByteForByte)
     }
     expected += u"</table>\r\n</BODY>\r\n</HTML>\r\n"_s;
     EXPECT_EQ(sheet(), expected);
+}
+
+TEST_F(LabelSheet, EveryLineOfALabelIsWrittenByteForByte)
+{
+    state.LabelDefs[11].FixedText = u"<מעל>"_s;
+    state.LabelDefs[12] = {1, 14, 2, 1, 1, u"מתחת & אחרי"_s};
+    options.rows = options.cols = u"1"_s;
+    options.useTitle.fill(true);
+    options.selectAccount = true;
+    state.WantedCrd = {u"C1"_s};
+    QString expected = headOf(u"100.0"_s, u"100.0"_s);
+    for (int line = 0; line <= 11; ++line)
+        expected += rulesOf(line);
+    const QString david = u" {font-family:David; font-weight:Bold; font-size:14pt; font-style:Italic; "
+                          "text-decoration: underline; text-align: "_s;
+    expected += u" .L12"_s + david + u"right; direction: rtl; color:black;}\r\n .LE12"_s + david
+        + u"left; direction: ltr; color:black;}\r\n</style>\r\n</HEAD>\r\n<BODY BGCOLOR='#FFFFFF'>\r\n"
+          "<table height='100%' width='100%' border='0' cellpadding='0' cellspacing='0' dir='rtl'>\r\n  <tr>\r\n"_s;
+    expected += cellOf({u"    <tr class=L0><td>לכבוד</td></tr>"_s, u"    <tr class=L11><td>&lt;מעל&gt;</td></tr>"_s,
+                        u"    <tr class=L1><td>אבג בע&quot;מ</td></tr>"_s,
+                        u"    <tr class=L12><td>מתחת &amp; אחרי</td></tr>"_s, u"    <tr class=L2><td>קוד: C1</td></tr>"_s,
+                        u"    <tr class=L3><td>לידי:משה, רכש</td></tr>"_s, u"    <tr class=L4><td>הרצל 1</td></tr>"_s,
+                        u"    <tr class=L7><td>גוש 5</td></tr>"_s,
+                        u"    <tr class=L5><td>חיפה&nbsp;&nbsp;&nbsp;&nbsp;12345</td></tr>"_s,
+                        u"    <tr class=L8><td>צפון</td></tr>"_s, u"    <tr class=L10><td>ישראל</td></tr>"_s});
+    expected += u"  </tr>\r\n</table>\r\n</BODY>\r\n</HTML>\r\n"_s;
+    EXPECT_EQ(sheet(), expected) << "line 9 (the state) is empty, so it is left out";
 }
 
 TEST_F(LabelSheet, TheStartPositionLeavesCellsOfTheFirstPageBlank)
@@ -156,6 +190,24 @@ TEST_F(LabelSheet, TheContactTemplateAndAttentionOptionsShapeTheContactLine)
     EXPECT_EQ(labels[2], QString()) << "no contact: the label has no line at all, yet it is not a blank cell";
 }
 
+TEST_F(LabelSheet, AContactAddressReplacesTheCardAddressFromSixCharactersOn)
+{
+    const auto card = [](const QString& code, const QString& contactAddress) {
+        return QStringList{insertRow(u"OCRD"_s, {{u"CardCode"_s, code}, {u"CardName"_s, code}, {u"CntctPrsn"_s, u"P"_s},
+                                                 {u"MailAddres"_s, u"Main St"_s}}),
+                           insertRow(u"OCPR"_s, {{u"CntctCode"_s, code.right(1).toInt()}, {u"CardCode"_s, code},
+                                                 {u"Name"_s, u"P"_s}, {u"Address"_s, contactAddress}})};
+    };
+    engine->createDatabase(u"contacts"_s,
+                           handMadeCompany(900000, card(u"A5"_s, u"12345"_s) + card(u"B6"_s, u"123456"_s)));
+    state.ConnDataBase = u"contacts"_s;
+    lines({4});
+    options.allContacts = options.useContactAddress = true;
+    EXPECT_EQ(cells(sheet()).mid(0, 2), (QStringList{u"Main St"_s, u"123456"_s}));
+    options.useContactAddress = false;
+    EXPECT_EQ(cells(sheet()).mid(0, 2), (QStringList{u"Main St"_s, u"Main St"_s}));
+}
+
 TEST_F(LabelSheet, AContactAddressLongerThanFiveCharactersReplacesTheCardAddress)
 {
     lines({4, 5, 7});
@@ -198,7 +250,7 @@ TEST_F(LabelSheet, AFailingStatementLeavesTheSheetAsFarAsItWasWritten)
     options.sqlWhereText = u"NoSuchColumn = 1"_s;
     const QString path = tempPath(u"sheet.htm"_s);
     RunContext run = context();
-    EXPECT_THROW(CreateLabFile(path, run), Failure);
+    EXPECT_EQ(failureOf([&] { CreateLabFile(path, run); }), u"no such column: NoSuchColumn"_s);
     EXPECT_TRUE(fromWindows1255(readFile(path)).endsWith(u"<BODY BGCOLOR='#FFFFFF'>\r\n"_s));
 }
 
@@ -230,6 +282,49 @@ TEST_F(LabelSheet, ABadLayoutFailsBeforeTheFileIsTouchedAndOpensNothing)
     }
     EXPECT_TRUE(browser.opened.isEmpty());
     EXPECT_EQ(readFile(path), "previous sheet");
+}
+
+TEST(LabelLayout, TheLayoutBoxesAreReadWithinTheirBoundsOrRefusedByName)
+{
+    struct Case {
+        QString rows, cols, start, copies;
+        QString refusal;  // empty: accepted
+    };
+    const QString notANumber = u"הערך \"%1\" בשדה \"%2\" אינו מספר. יש לתקן אותו ולהפעיל שוב."_s;
+    const QString outOfRange = u"הערך %1 בשדה \"%2\" מחוץ לתחום המותר: %3 עד %4."_s;
+    const Case cases[] = {
+        {u"32767"_s, u"1"_s, u"1"_s, u"1"_s, {}},
+        {u"1"_s, u"32767"_s, u"-32768"_s, u"0"_s, {}},
+        {u"181"_s, u"181"_s, u"32767"_s, u"255"_s, {}},
+        {u"200"_s, u"200"_s, u"1"_s, u"1"_s, u"דף של 200 שורות ו-200 עמודות גדול מדי: מותרות עד 32767 מדבקות בדף."_s},
+        {u"128"_s, u"256"_s, u"1"_s, u"1"_s, u"דף של 128 שורות ו-256 עמודות גדול מדי: מותרות עד 32767 מדבקות בדף."_s},
+        {u"0"_s, u"3"_s, u"1"_s, u"1"_s, outOfRange.arg(u"0"_s, u"שורות"_s).arg(1).arg(32767)},
+        {u"8"_s, u"32768"_s, u"1"_s, u"1"_s, outOfRange.arg(u"32768"_s, u"עמודות"_s).arg(1).arg(32767)},
+        {u"8"_s, u"3"_s, u"-32769"_s, u"1"_s, outOfRange.arg(u"-32769"_s, u"התחל ממדבקה"_s).arg(-32768).arg(32767)},
+        {u"8"_s, u"3"_s, u"1"_s, u"256"_s, outOfRange.arg(u"256"_s, u"עותקים"_s).arg(0).arg(255)},
+        {u"8"_s, u"3"_s, u"1"_s, u"-1"_s, outOfRange.arg(u"-1"_s, u"עותקים"_s).arg(0).arg(255)},
+        {u"8"_s, u"three"_s, u"1"_s, u"1"_s, notANumber.arg(u"three"_s, u"עמודות"_s)},
+    };
+    for (const Case& c : cases) {
+        MailingOptions options;
+        options.rows = c.rows;
+        options.cols = c.cols;
+        options.startFrom = c.start;
+        options.copies = c.copies;
+        try {
+            const LabelLayout layout = LabelLayout::read(options);
+            EXPECT_TRUE(c.refusal.isEmpty()) << c.refusal.toStdString();
+            EXPECT_EQ(layout.perPage(), c.rows.toInt() * c.cols.toInt());
+            EXPECT_EQ(layout.start, c.start.toInt());
+            EXPECT_EQ(layout.copies, c.copies.toInt());
+        } catch (const Failure& failure) {
+            EXPECT_EQ(failure.description(), c.refusal);
+        }
+    }
+    MailingOptions typed;
+    typed.rows = u" 2.5 "_s;
+    typed.cols = u"3.5"_s;
+    EXPECT_EQ(LabelLayout::read(typed).perPage(), 8) << "a fraction rounds half to even, as the classic conversion";
 }
 
 TEST(LabelSizes, CellSizesHaveTwoIntegerDigitsAndOneDecimal)

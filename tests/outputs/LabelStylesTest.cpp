@@ -39,12 +39,13 @@ TEST_F(LabelStyles, SavingWritesThirteenSectionsAndLineSixFollowsLineThree)
 
 TEST_F(LabelStyles, AStoredValueThatIsNotAByteIsPassedOver)
 {
-    defs[4].FontSize = 17;
-    store.setValue(u"Pelmar"_s, u"LabelDef4"_s, u"FontSize"_s, u"300"_s);
-    store.setValue(u"Pelmar"_s, u"LabelDef4"_s, u"Font"_s, u"2"_s);
+    defs[4] = {1, 17, 1, 1, 1, {}};
+    const std::pair<const char16_t*, const char16_t*> stored[] = {
+        {u"FontSize", u"256"}, {u"Font", u"-1"}, {u"FontWeight", u"two"}, {u"FontUL", u"0"}, {u"FontItalic", u" 255 "}};
+    for (const auto& [key, value] : stored)
+        store.setValue(u"Pelmar"_s, u"LabelDef4"_s, QString::fromUtf16(key), QString::fromUtf16(value));
     SetGetLabelDefs(2, store, defs);
-    EXPECT_EQ(defs[4].FontSize, 17);
-    EXPECT_EQ(defs[4].Font, 2);
+    EXPECT_EQ(defs[4], (LabelDefRec{1, 17, 1, 0, 255, {}})) << "256, -1 and two are passed over; 0 and 255 taken";
 }
 
 }  // namespace

@@ -1,7 +1,13 @@
 #include "common/Failure.h"
 #include "selection/CheckListModel.h"
 #include "selection/PickerData.h"
+#include "support/Engines.h"
 #include "support/Isolated.h"
+#include "support/FailureOf.h"
+
+#include <QSet>
+
+#include <algorithm>
 
 using namespace Qt::StringLiterals;
 
@@ -44,8 +50,31 @@ TEST_F(CardFileTest, FieldsAreCutAtTabsWithTheFallbacksOfShortLines)
                            1, true),
               QStringList{u"א1"_s})
         << "windows-1255";
-    EXPECT_THROW(cardFileColumn(u"two"_s), Failure);
-    EXPECT_THROW(cardFileColumn(u"0"_s), Failure);
+    EXPECT_EQ(cardFileColumn(u" 1 "_s), 1);
+    EXPECT_EQ(cardFileColumn(u"32767"_s), 32767);
+    for (const QString& column : {u"two"_s, u"0"_s, u"32768"_s, u"-1"_s})
+        EXPECT_EQ(failureOf([&] { cardFileColumn(column); }),
+                  u"מספר העמודה \"%1\" אינו תקין: יש לכתוב מספר שלם מ-1 ומעלה."_s.arg(column));
+}
+
+TEST(CardList, CardsComeInBatchesOfFiveThousandEachCodeOnce)
+{
+    const auto engine = makeSqliteEngine();
+    CompanyOptions options;
+    options.cards = 5001;
+    engine->createCompany(u"many"_s, options);
+    QList<qsizetype> batches;
+    QStringList codes;
+    readCardList(engine->client(), engine->connString(u"many"_s),
+                 u"SELECT OCRD.CardCode, OCRD.CardName FROM OCRD ORDER BY OCRD.CardCode"_s,
+                 [&](const QVector<CheckListModel::Row>& rows) {
+                     batches << rows.size();
+                     for (const auto& row : rows)
+                         codes << row.key;
+                 });
+    EXPECT_EQ(batches, (QList<qsizetype>{5000, 1}));
+    EXPECT_EQ(QSet<QString>(codes.begin(), codes.end()).size(), 5001);
+    EXPECT_TRUE(std::is_sorted(codes.begin(), codes.end())) << "in the statement's order";
 }
 
 TEST(CheckListModel, TextsSortWithNumbersByValueFirst)

@@ -2,44 +2,21 @@
 #include "options/MailingOptions.h"
 #include "selection/SelectBuilder.h"
 #include "selection/WhereBuilder.h"
-#include "support/Engines.h"
-#include "support/MemoryCompany.h"
+#include "support/GeneratedCompany.h"
 #include "support/QtPrinting.h"
 
 #include <QDate>
 #include <QSet>
 
-#include <map>
 
 using namespace Qt::StringLiterals;
 
 namespace pelmar::test {
 namespace {
 
-CompanyOptions companyOptions()
-{
-    CompanyOptions options;
-    options.seed = 11;
-    options.cards = 700;
-    return options;
-}
-
-// The generated company in memory, to work out independently which cards a criterion selects.
 const MemoryCompany& company()
 {
-    static const MemoryCompany memory(companyOptions());
-    return memory;
-}
-
-Engine& engineFor(EngineFactory factory)
-{
-    static std::map<EngineFactory, std::unique_ptr<Engine>> engines;
-    auto& engine = engines[factory];
-    if (!engine) {
-        engine = factory();
-        engine->createCompany(u"selection"_s, companyOptions());
-    }
-    return *engine;
+    return generatedCompany();
 }
 
 QString text(const QVariantMap& row, const QString& column)
@@ -316,7 +293,7 @@ QList<SelectionCase> selectionCases()
 
 class RecipientSelection : public ::testing::TestWithParam<EngineFactory> {
 protected:
-    Engine& engine() { return engineFor(GetParam()); }
+    Engine& engine() { return generatedCompanyEngine(GetParam()); }
 
     std::unique_ptr<Recordset> run(const QString& statement)
     {

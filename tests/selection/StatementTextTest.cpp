@@ -2,7 +2,6 @@
 #include "common/SessionState.h"
 #include "options/MailingOptions.h"
 #include "selection/DateText.h"
-#include "selection/DocTypes.h"
 #include "selection/SelectBuilder.h"
 #include "selection/SelectedCards.h"
 #include "selection/WhereBuilder.h"
@@ -235,11 +234,20 @@ TEST(StatementText, DatesAreReadDayFirstWithTwoDigitYearsAndRollOver)
     EXPECT_EQ(DateFromText(u"1/1/00"_s), QDate(2000, 1, 1));
     EXPECT_EQ(DateFromText(u"15/6/2004"_s), QDate(2004, 6, 15));
     EXPECT_EQ(DateFromText(u"5/3/05"_s), DateFromText(u"05/03/2005"_s));
-    EXPECT_EQ(DateFromText(u"01/01/79"_s), QDate(2079, 1, 1));
+    EXPECT_EQ(DateFromText(u"01/01/79"_s), QDate(2079, 1, 1)) << "below 80 is this century";
+    EXPECT_EQ(DateFromText(u"01/01/80"_s), QDate(1980, 1, 1));
+    EXPECT_EQ(DateFromText(u"1/1/100"_s), QDate(100, 1, 1)) << "three digits are taken as written";
     EXPECT_EQ(DateFromText(u"32/12/2004"_s), QDate(2005, 1, 1));
     EXPECT_EQ(DateFromText(u"1/13/2004"_s), QDate(2005, 1, 1));
-    EXPECT_THROW(DateFromText(u"2004-06-15"_s), Failure);
-    EXPECT_THROW(DateFromText(QString()), Failure);
+    for (const QString& text : {u"2004-06-15"_s, QString(), u"1/-1/05"_s, u"+1/1/05"_s, u"1/1/"_s, u"1/1/0x5"_s}) {
+        try {
+            DateFromText(text);
+            ADD_FAILURE() << text.toStdString();
+        } catch (const Failure& failure) {
+            EXPECT_EQ(failure.description(),
+                      u"התאריך \"%1\" אינו תקין. יש לכתוב תאריך בצורה יום/חודש/שנה, למשל 15/06/2004."_s.arg(text));
+        }
+    }
 }
 
 TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
@@ -332,16 +340,6 @@ TEST(SelectedCards, TheListIsExactCaseSensitiveAndKeepsDuplicates)
     EXPECT_FALSE(selectionFilterOn(state, false));
     replaceSelectedCards(state, {});
     EXPECT_FALSE(selectionFilterOn(state, true));
-}
-
-TEST(DocTypes, CardTypeLettersAndDocumentTables)
-{
-    EXPECT_EQ(CardTypeCode(2, true), u"C"_s);
-    EXPECT_EQ(CardTypeCode(2, false), u"L"_s);
-    EXPECT_EQ(CardTypeCode(3, false), u"All"_s);
-    EXPECT_EQ(GetDocTypeInfo(8).DateField, u"PayDate"_s);
-    EXPECT_FALSE(GetDocTypeInfo(8).HasContact);
-    EXPECT_EQ(GetDocTypeInfo(42).TableName, u"OINV"_s);
 }
 
 }  // namespace

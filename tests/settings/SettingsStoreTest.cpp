@@ -1,6 +1,9 @@
 #include "settings/SettingsStore.h"
+
+#include "common/Failure.h"
 #include "support/Isolated.h"
 
+#include <QDir>
 #include <QFile>
 
 #include <sys/stat.h>
@@ -37,11 +40,27 @@ TEST_F(SettingsStoreTest, TheFileIsReadableByItsOwnerOnlyAndStaysSoAfterRewrites
     EXPECT_EQ(info.st_mode & 0777, 0600u);
 }
 
-TEST_F(SettingsStoreTest, AStoreThatCannotBeWrittenReportsIt)
+// The description of the failure a write meets; empty when it succeeds.
+QString writeFailure(SettingsStore& store)
+{
+    try {
+        store.setValue(u"Pelmar"_s, u"Params"_s, u"Rows"_s, u"8"_s);
+    } catch (const Failure& failure) {
+        return failure.description();
+    }
+    return {};
+}
+
+TEST_F(SettingsStoreTest, AStoreThatCannotBeWrittenReportsItByName)
 {
     writeFile(path(u"blocked"_s), "not a folder");
-    SettingsStore store(path(u"blocked"_s));
-    EXPECT_ANY_THROW(store.setValue(u"Pelmar"_s, u"Params"_s, u"Rows"_s, u"8"_s));
+    SettingsStore blocked(path(u"blocked"_s));
+    EXPECT_TRUE(writeFailure(blocked).startsWith(u"Cannot create the settings file %1/Pelmar.conf"_s.arg(path(u"blocked"_s))));
+
+    QDir().mkpath(configFolder() + u"/Pelmar.conf"_s);
+    SettingsStore folder(configFolder());
+    EXPECT_EQ(writeFailure(folder), u"Cannot write the settings file %1/Pelmar.conf."_s.arg(configFolder()))
+        << "the file is a folder";
 }
 
 }  // namespace
