@@ -1,10 +1,15 @@
+#include "common/DesktopBrowser.h"
 #include "common/Failure.h"
 #include "common/TextFileWriter.h"
 #include "common/UserText.h"
 #include "common/Windows1255.h"
+#include "support/FailureOf.h"
 #include "support/Isolated.h"
 
 #include <QDir>
+#include <QFile>
+#include <QTemporaryDir>
+#include <QThread>
 
 using namespace Qt::StringLiterals;
 
@@ -32,6 +37,7 @@ TEST(Windows1255, TheEdgesOfTheCodePage)
     EXPECT_EQ(windows1255Byte(0x05EB), 0) << "one past tav";
     EXPECT_EQ(toWindows1255(u"\u0080"_s, true), QByteArray("&#128;"));
     EXPECT_EQ(toWindows1255(QString(QChar(0xD83D)), true), QByteArray("&#55357;")) << "a lone half of a pair";
+    EXPECT_EQ(toWindows1255(u"\uFFFD"_s, true), QByteArray("&#65533;")) << "the bytes the code page leaves undefined";
 }
 
 TEST(UserText, Utf8WithOrWithoutItsMarkElseWindows1255)
@@ -39,6 +45,27 @@ TEST(UserText, Utf8WithOrWithoutItsMarkElseWindows1255)
     EXPECT_EQ(decodeUserText("\xEF\xBB\xBF\xD7\x90"), u"א"_s) << "the mark is not part of the text";
     EXPECT_EQ(decodeUserText("\xD7\x90"), u"א"_s);
     EXPECT_EQ(decodeUserText("\xE0"), u"א"_s) << "not UTF-8";
+}
+
+TEST(DesktopBrowser, TheCommandOfTheEnvironmentGetsThePathOrItsFailureIsNamed)
+{
+    QTemporaryDir folder;
+    const QString copy = folder.filePath(u"copy"_s);
+    const QString page = folder.filePath(u"page.htm"_s);
+    writeFile(page, "<p>");
+    const QString browser = folder.filePath(u"browser"_s);
+    writeFile(browser, "#!/bin/sh\ncp \"$2\" \"" + copy.toUtf8() + "\"\n");
+    QFile::setPermissions(browser, QFileDevice::ReadOwner | QFileDevice::ExeOwner);
+    qputenv("PELMAR_BROWSER", browser.toUtf8() + " --new-window");
+    DesktopBrowser().open(page);
+    for (int waited = 0; waited < 100 && readFile(copy).isEmpty(); ++waited)
+        QThread::msleep(50);
+    EXPECT_EQ(readFile(copy), "<p>") << "the path is the command's last argument";
+
+    qputenv("PELMAR_BROWSER", "/no/such/browser --new-window");
+    EXPECT_EQ(failureOf([&] { DesktopBrowser().open(page); }),
+              u"לא ניתן להפעיל את הדפדפן \"/no/such/browser\" (PELMAR_BROWSER)."_s);
+    qunsetenv("PELMAR_BROWSER");
 }
 
 class TextFileWriterTest : public Isolated {

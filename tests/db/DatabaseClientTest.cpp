@@ -1,9 +1,10 @@
 #include "common/Failure.h"
 #include "db/ConnString.h"
+#include "db/DatabaseConnection.h"
 #include "support/Engines.h"
+#include "support/FailureOf.h"
 #include "support/PgCluster.h"
 #include "support/QtPrinting.h"
-#include "support/FailureOf.h"
 
 #include <QElapsedTimer>
 
@@ -50,6 +51,9 @@ TEST_P(DatabaseClientTest, ASecondPassAfterMoveFirstReadsTheSameRows)
     EXPECT_EQ(first, (QStringList{u"C001"_s, u"C002"_s, u"C003"_s}));
     EXPECT_EQ(second, (QStringList{u"אבג בע\"מ"_s, u"O'Brien & <Sons>"_s, u"Third"_s}));
     EXPECT_EQ(failureOf([&] { rows->moveNext(); }), kPastTheEnd) << "moving past the end is an error";
+    rows->close();
+    EXPECT_TRUE(rows->eof());
+    EXPECT_EQ(failureOf([&] { rows->moveFirst(); }), u"The recordset is closed."_s);
 }
 
 TEST_P(DatabaseClientTest, NullsEmptyTextAndAliasesReadAsTheyAre)
@@ -130,6 +134,20 @@ TEST_P(DatabaseClientTest, AStatementThatFailsOnItsThirdRowThrowsInsteadOfEnding
     }
     // PostgreSQL fetches the rows in batches, so its error comes with the first.
     EXPECT_EQ(read, postgres ? QStringList{} : (QStringList{u"C001"_s, u"C002"_s}));
+}
+
+TEST(DatabaseErrors, TheDescriptionIsTheDatabasesElseTheDriversAndTheNumberTheNativeCode)
+{
+    const Failure database
+        = pelmar::failureOf(QSqlError(u"driver says"_s, u" database says "_s, QSqlError::StatementError, u"3022"_s));
+    EXPECT_EQ(database.description(), u"database says"_s);
+    EXPECT_EQ(database.number(), 3022);
+    const Failure driver = pelmar::failureOf(QSqlError(u"driver says"_s, {}, QSqlError::ConnectionError, u"HY000"_s));
+    EXPECT_EQ(driver.description(), u"driver says"_s);
+    EXPECT_EQ(driver.number(), Failure::kUnspecified) << "a code that is no number";
+    const Failure none = pelmar::failureOf(QSqlError({}, {}, QSqlError::UnknownError, u"0"_s));
+    EXPECT_EQ(none.description(), u"The database reported an error without a description."_s);
+    EXPECT_EQ(none.number(), Failure::kUnspecified);
 }
 
 INSTANTIATE_TEST_SUITE_P(Engines, DatabaseClientTest, ::testing::Values(&makeSqliteEngine, &makePostgresEngine),

@@ -2,8 +2,8 @@
 #include "common/Windows1255.h"
 #include "outputs/RecipientList.h"
 #include "outputs/Runs.h"
-#include "support/LabelCompany.h"
 #include "support/FailureOf.h"
+#include "support/LabelCompany.h"
 
 #include <QRegularExpression>
 
@@ -124,9 +124,22 @@ TEST_F(RecipientListTest, ThePreviewWritesTheListOfTheChosenOutputAndLogsIt)
     EXPECT_TRUE(fromWindows1255(readFile(tempPath(u"pelmar.log"_s))).contains(u"רשימת מעקב<br>"_s));
 
     options.outType = -1;
-    options.rows = u"0"_s;
-    EXPECT_EQ(failureOf([&] { run(u"list"_s); }), u"הערך 0 בשדה \"שורות\" מחוץ לתחום המותר: 1 עד 32767."_s);
+    const std::pair<QString MailingOptions::*, QString> refused[]
+        = {{&MailingOptions::rows, u"הערך 0 בשדה \"שורות\" מחוץ לתחום המותר: 1 עד 32767."_s},
+           {&MailingOptions::cols, u"הערך 32768 בשדה \"עמודות\" מחוץ לתחום המותר: 1 עד 32767."_s},
+           {&MailingOptions::copies, u"הערך 256 בשדה \"עותקים\" מחוץ לתחום המותר: 0 עד 255."_s}};
+    for (const auto& [box, message] : refused) {
+        MailingOptions kept = options;
+        options.*box = message.section(u' ', 1, 1);
+        EXPECT_EQ(failureOf([&] { run(u"list"_s); }), message);
+        options = kept;
+    }
     EXPECT_EQ(browser.opened.size(), 1) << "a list that cannot be written opens no window";
+    options.cols = u"32767"_s;
+    options.copies = u"255"_s;
+    run(u"list"_s);
+    EXPECT_TRUE(fromWindows1255(readFile(tempPath(u"pelmar2.htm"_s))).contains(u"מספר הדפים הנדרשים: 1</p>"_s))
+        << "the largest layout the boxes take";
 }
 
 TEST(LabelPages, PagesNeededForTheRecipientsAndCopies)

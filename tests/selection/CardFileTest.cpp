@@ -2,8 +2,8 @@
 #include "selection/CheckListModel.h"
 #include "selection/PickerData.h"
 #include "support/Engines.h"
-#include "support/Isolated.h"
 #include "support/FailureOf.h"
+#include "support/Isolated.h"
 
 #include <QSet>
 
@@ -77,12 +77,55 @@ TEST(CardList, CardsComeInBatchesOfFiveThousandEachCodeOnce)
     EXPECT_TRUE(std::is_sorted(codes.begin(), codes.end())) << "in the statement's order";
 }
 
-TEST(CheckListModel, TextsSortWithNumbersByValueFirst)
+// A picker's list: key, a code and a name, the check box in the first column.
+class PickerList : public CheckListModel {
+public:
+    PickerList() : CheckListModel({u"v"_s, u"code"_s, u"name"_s}, {CheckListModel::kCheckColumn, 0, 1})
+    {
+        setRows({{u"a"_s, {u"100"_s, u"beta"_s}},
+                 {u"b"_s, {u"x"_s, u"Alpha"_s}},
+                 {u"c"_s, {u"20"_s, u"alpine"_s}},
+                 {u"d"_s, {u"3.5"_s, u"Gamma"_s}}});
+    }
+};
+
+TEST(CheckListModel, TextsSortWithNumbersByValueFirstThenWithoutRegardToCase)
 {
-    CheckListModel numbers({u"n"_s}, {0});
-    numbers.setRows({{u"a"_s, {u"100"_s}}, {u"b"_s, {u"x"_s}}, {u"c"_s, {u"20"_s}}, {u"d"_s, {u"3.5"_s}}});
-    numbers.sortByText(0);
-    EXPECT_EQ(texts(numbers), (QStringList{u"3.5"_s, u"20"_s, u"100"_s, u"x"_s})) << "numbers by value";
+    PickerList model;
+    model.sortByText(0);
+    EXPECT_EQ(texts(model), (QStringList{u"3.5"_s, u"20"_s, u"100"_s, u"x"_s}));
+    model.sortByText(1);
+    EXPECT_EQ(texts(model, 1), (QStringList{u"Alpha"_s, u"alpine"_s, u"beta"_s, u"Gamma"_s}));
+    model.setChecked(2, true);
+    model.setChecked(3, true);
+    model.sortByCheckThenText(0);
+    EXPECT_EQ(model.checkedKeys(), (QStringList{u"d"_s, u"a"_s})) << "checked first, then by the text";
+    EXPECT_EQ(texts(model), (QStringList{u"3.5"_s, u"100"_s, u"20"_s, u"x"_s}));
+}
+
+TEST(CheckListModel, ChecksAreSetInvertedAndSearchedAsTheGridShowsThem)
+{
+    PickerList model;
+    QList<std::pair<QModelIndex, QModelIndex>> changed;
+    QObject::connect(&model, &CheckListModel::dataChanged, [&](const QModelIndex& from, const QModelIndex& to) {
+        changed.append({from, to});
+    });
+    EXPECT_TRUE(model.setData(model.index(1, 0), Qt::Checked, Qt::CheckStateRole));
+    EXPECT_FALSE(model.setData(model.index(1, 1), Qt::Checked, Qt::CheckStateRole)) << "a text is not a check box";
+    EXPECT_EQ(model.data(model.index(1, 0), Qt::CheckStateRole), QVariant(Qt::Checked));
+    EXPECT_TRUE(model.flags(model.index(1, 0)) & Qt::ItemIsUserCheckable);
+    EXPECT_FALSE(model.flags(model.index(1, 2)) & Qt::ItemIsUserCheckable);
+    model.invertChecks();
+    EXPECT_EQ(model.checkedKeys(), (QStringList{u"a"_s, u"c"_s, u"d"_s}));
+    model.setAllChecked(false);
+    EXPECT_TRUE(model.checkedKeys().isEmpty());
+    ASSERT_EQ(changed.size(), 3);
+    EXPECT_EQ(changed[0], std::make_pair(model.index(1, 0), model.index(1, 0)));
+    EXPECT_EQ(changed[2], std::make_pair(model.index(0, 0), model.index(3, 2))) << "every row and column is shown anew";
+
+    EXPECT_EQ(model.findPrefix(1, u"ALP"_s), 1) << "the first from the top, without regard to case";
+    EXPECT_EQ(model.findPrefix(1, u"gamma!"_s), -1);
+    EXPECT_EQ(model.findPrefix(1, QString()), -1) << "an empty search finds nothing";
 }
 
 }  // namespace

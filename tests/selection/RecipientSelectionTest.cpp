@@ -8,7 +8,6 @@
 #include <QDate>
 #include <QSet>
 
-
 using namespace Qt::StringLiterals;
 
 namespace pelmar::test {
@@ -398,6 +397,53 @@ TEST_P(RecipientSelection, TheAddressSourceAndSchemaLevelChooseTheLabelColumns)
                 ASSERT_FALSE(rows->hasColumn(u"MailCountry"_s));
         }
         EXPECT_GT(checked, 50) << a.source;
+    }
+}
+
+TEST_P(RecipientSelection, ADocumentsContactIsTheLabelsContactWhereTheDocumentNamesOne)
+{
+    struct Table {
+        QString name, cardField;
+        bool namesContact;
+    };
+    const Table tables[]
+        = {{u"OINV"_s, u"CardCode"_s, true},    {u"ORIN"_s, u"CardCode"_s, true}, {u"ODLN"_s, u"CardCode"_s, true},
+           {u"OPOR"_s, u"CardCode"_s, true},    {u"OQUT"_s, u"CardCode"_s, true}, {u"ORCT"_s, u"CardCode"_s, true},
+           {u"OCHO"_s, u"VendorCode"_s, false}, {u"OVPM"_s, u"CardCode"_s, true}, {u"OCRV"_s, u"CardCode"_s, false}};
+    QHash<int, QString> contactNames;
+    for (const QVariantMap& contact : company().rows(u"OCPR"_s))
+        contactNames.insert(contact.value(u"CntctCode"_s).toInt(), text(contact, u"Name"_s));
+    QHash<QString, QString> mainContacts;
+    for (const QVariantMap& card : company().rows(u"OCRD"_s)) {
+        const auto main = contactsOf(card, true);
+        mainContacts.insert(text(card, u"CardCode"_s), main.isEmpty() ? QString() : text(main.first(), u"Name"_s));
+    }
+    for (int docType = 0; docType < 9; ++docType) {
+        const Table& table = tables[docType];
+        QMultiHash<QString, QString> documentContacts;
+        for (const QVariantMap& doc : company().rows(table.name)) {
+            const QVariant contact = doc.value(u"CntctCode"_s);
+            documentContacts.insert(text(doc, table.cardField),
+                                    contact.isNull() ? QString() : contactNames.value(contact.toInt()));
+        }
+        MailingOptions c;
+        c.dates = true;
+        c.fromDate = u"1/1/03"_s;
+        c.toDate = u"31/12/25"_s;
+        c.docType = docType;
+        int otherThanMain = 0;
+        for (auto rows = run(recipientStatement(c, SessionState{}, kLabels, true, false)); !rows->eof();
+             rows->moveNext()) {
+            const QString code = rows->value(u"CardCode"_s).toString();
+            const QString attn = rows->value(u"Attn"_s).toString();
+            const QString expected
+                = table.namesContact && documentContacts.values(code).contains(attn) ? attn : mainContacts.value(code);
+            ASSERT_EQ(attn, expected) << table.name.toStdString() << " " << code.toStdString();
+            otherThanMain += attn != mainContacts.value(code);
+        }
+        if (table.namesContact) {
+            EXPECT_GT(otherThanMain, 0) << table.name.toStdString() << ": the fixture must tell the two apart";
+        }
     }
 }
 

@@ -250,6 +250,18 @@ TEST(StatementText, DatesAreReadDayFirstWithTwoDigitYearsAndRollOver)
     }
 }
 
+TEST(StatementText, TheAddressExpressionStandsOnlyWhenSwitchedOnAndGiven)
+{
+    MailingOptions c;
+    c.addressFrom = 0;
+    c.sqlAddress = u"OCRD.Notes"_s;
+    EXPECT_TRUE(BuildSelect(c, 1, 0, true, kLabels).contains(u"OCRD.CardName, OCRD.MailAddres, "_s)) << "switched off";
+    c.addressBySql = true;
+    EXPECT_TRUE(BuildSelect(c, 1, 0, true, kLabels).contains(u"OCRD.CardName, OCRD.Notes As MailAddres, "_s));
+    c.sqlAddress.clear();
+    EXPECT_TRUE(BuildSelect(c, 1, 0, true, kLabels).contains(u"OCRD.CardName, OCRD.MailAddres, "_s)) << "nothing given";
+}
+
 TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
 {
     MailingOptions c;
