@@ -5,6 +5,8 @@
 #include "selection/SelectBuilder.h"
 #include "selection/SelectedCards.h"
 #include "selection/WhereBuilder.h"
+#include "support/FailureOf.h"
+#include "support/OptionsWith.h"
 #include "support/QtPrinting.h"
 
 #include <gtest/gtest.h>
@@ -43,189 +45,72 @@ TEST(StatementText, TheDocumentedExamplesComeOutByteForByte)
     EXPECT_EQ(BuildOrderBy(labels, 0, 0, kLabels), u" ORDER BY OCPR.Name ASC, OCRD.MailZipCod ASC"_s);
 }
 
-struct WhereCase {
-    const char* name;
-    std::function<void(MailingOptions&, SessionState&)> set;
-    QString expected;
-};
-
 TEST(StatementText, EachCriterionAddsItsFragmentInOrder)
 {
-    const WhereCase cases[] = {
-        {"nothing on", [](MailingOptions&, SessionState&) {}, u" Where (1 > 0)"_s},
-        {"type without groups",
-         [](MailingOptions& c, SessionState&) {
-             c.catCode = true;
-             c.cardType = 1;
-         },
-         u" Where (1 > 0) AND OCRD.CardType = 'S'"_s},
-        {"no type chosen",
-         [](MailingOptions& c, SessionState&) {
-             c.catCode = true;
-             c.cardType = -1;
-         },
-         u" Where (1 > 0) AND OCRD.CardType = 'All'"_s},
-        {"leads",
-         [](MailingOptions& c, SessionState&) {
-             c.catCode = true;
-             c.cardType = 2;
-         },
-         u" Where (1 > 0) AND OCRD.CardType = 'L'"_s},
-        {"code range with apostrophes",
-         [](MailingOptions& c, SessionState&) {
-             c.codeRange = true;
-             c.fromCard = u"C'01"_s;
-             c.toCard = u"C'09"_s;
-         },
+    const std::pair<QStringList, QString> cases[] = {
+        {{}, u" Where (1 > 0)"_s},
+        {{u"ChkCatCode=1"_s, u"cmbCS=1"_s}, u" Where (1 > 0) AND OCRD.CardType = 'S'"_s},
+        {{u"ChkCatCode=1"_s, u"cmbCS=-1"_s}, u" Where (1 > 0) AND OCRD.CardType = 'All'"_s},
+        {{u"ChkCatCode=1"_s, u"cmbCS=2"_s}, u" Where (1 > 0) AND OCRD.CardType = 'L'"_s},
+        {{u"ChkAccKey=1"_s, u"TxtFromCrd=C'01"_s, u"TxtToCrd=C'09"_s},
          u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'C''01' And N'C''09'"_s},
-        {"empty code range", [](MailingOptions& c, SessionState&) { c.codeRange = true; },
-         u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'' And N''"_s},
-        {"city of the mailing address",
-         [](MailingOptions& c, SessionState&) {
-             c.city = true;
-             c.cityPrefix = u"קריית"_s;
-             c.addressFrom = 0;
-         },
+        {{u"ChkAccKey=1"_s}, u" Where (1 > 0) AND OCRD.CardCode BETWEEN N'' And N''"_s},
+        {{u"ChkCity=1"_s, u"TxtCity=קריית"_s, u"cmbAddressFrom=0"_s},
          u" Where (1 > 0) AND OCRD.MailCity LIKE N'קריית%'"_s},
-        {"city of the card address",
-         [](MailingOptions& c, SessionState&) {
-             c.city = true;
-             c.cityPrefix = u"ב'"_s;
-             c.addressFrom = 1;
-         },
-         u" Where (1 > 0) AND OCRD.City LIKE N'ב''%'"_s},
-        {"phone 2",
-         [](MailingOptions& c, SessionState&) {
-             c.phone = true;
-             c.phoneType = 1;
-             c.phonePrefix = u"03"_s;
-         },
-         u" Where (1 > 0) AND OCRD.Phone2 LIKE N'03%'"_s},
-        {"mobile",
-         [](MailingOptions& c, SessionState&) {
-             c.phone = true;
-             c.phoneType = 2;
-             c.phonePrefix = u"05"_s;
-         },
-         u" Where (1 > 0) AND OCRD.Cellular LIKE N'05%'"_s},
-        {"fax",
-         [](MailingOptions& c, SessionState&) {
-             c.phone = true;
-             c.phoneType = 3;
-             c.phonePrefix = u"04"_s;
-         },
-         u" Where (1 > 0) AND OCRD.Fax LIKE N'04%'"_s},
-        {"contact mobile",
-         [](MailingOptions& c, SessionState&) {
-             c.phone = true;
-             c.phoneType = 4;
-             c.phonePrefix = u"052"_s;
-         },
-         u" Where (1 > 0) AND OCPR.Cellolar LIKE N'052%'"_s},
-        {"no phone type",
-         [](MailingOptions& c, SessionState&) {
-             c.phone = true;
-             c.phoneType = -1;
-         },
-         u" Where (1 > 0) AND OCRD.Phone1 LIKE N'%'"_s},
-        {"sales employee",
-         [](MailingOptions& c, SessionState&) {
-             c.agent = true;
-             c.agents = {{u"ללא"_s, -1}};
-             c.agentIndex = 0;
-         },
-         u" Where (1 > 0) AND OCRD.SlpCode = -1"_s},
-        {"documents present",
-         [](MailingOptions& c, SessionState&) {
-             c.dates = true;
-             c.fromDate = u"31/12/99"_s;
-             c.toDate = u"1/1/00"_s;
-             c.docType = 2;
-             c.toDocNum = u"77"_s;
-         },
+        {{u"ChkCity=1"_s, u"TxtCity=ב'"_s, u"cmbAddressFrom=1"_s}, u" Where (1 > 0) AND OCRD.City LIKE N'ב''%'"_s},
+        {{u"ChkCity=1"_s, u"cmbAddressFrom=2"_s}, u" Where (1 > 0) AND OCRD.MailCity LIKE N'%'"_s},
+        {{u"ChkPhone=1"_s, u"cmbPhoneType=1"_s, u"txtPhone=03"_s}, u" Where (1 > 0) AND OCRD.Phone2 LIKE N'03%'"_s},
+        {{u"ChkPhone=1"_s, u"cmbPhoneType=2"_s, u"txtPhone=05"_s}, u" Where (1 > 0) AND OCRD.Cellular LIKE N'05%'"_s},
+        {{u"ChkPhone=1"_s, u"cmbPhoneType=3"_s, u"txtPhone=04"_s}, u" Where (1 > 0) AND OCRD.Fax LIKE N'04%'"_s},
+        {{u"ChkPhone=1"_s, u"cmbPhoneType=4"_s, u"txtPhone=052"_s}, u" Where (1 > 0) AND OCPR.Cellolar LIKE N'052%'"_s},
+        {{u"ChkPhone=1"_s, u"cmbPhoneType=-1"_s}, u" Where (1 > 0) AND OCRD.Phone1 LIKE N'%'"_s},
+        {{u"ChkDates=1"_s, u"TxtFromDate=31/12/99"_s, u"TxtToDate=1/1/00"_s, u"CmbDocType=2"_s, u"txtToDocNum=77"_s},
          u" Where (1 > 0) AND ODLN.DocDate Between '12/31/1999' And '01/01/2000' And ODLN.DocNum<=77"_s},
-        {"checks absent",
-         [](MailingOptions& c, SessionState&) {
-             c.dates = true;
-             c.fromDate = u"15/6/2004"_s;
-             c.toDate = u"5/3/05"_s;
-             c.docType = 6;
-             c.byDoc = 1;
-         },
-         u" Where (1 > 0) AND OCRD.CardCode Not In (Select Distinct VendorCode From OCHO Where OCHO.PmntDate Between '06/15/2004' And '03/05/2005')"_s},
-        {"documents with no relation",
-         [](MailingOptions& c, SessionState&) {
-             c.dates = true;
-             c.fromDate = c.toDate = u"1/1/05"_s;
-             c.byDoc = -1;
-         },
-         u" Where (1 > 0)"_s},
-        {"items",
-         [](MailingOptions& c, SessionState&) {
-             c.items = true;
-             c.fromItem = u"A'1"_s;
-             c.toItem = u"B"_s;
-         },
-         u" Where (1 > 0) AND (OCRD.CardCode IN (SELECT CardCode FROM OINV, INV1 Where INV1.DocEntry = OINV.DocEntry And INV1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode) OR OCRD.CardCode IN (SELECT CardCode FROM ORIN, RIN1 Where RIN1.DocEntry = ORIN.DocEntry And RIN1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode))"_s},
-        {"properties none chosen", [](MailingOptions& c, SessionState&) { c.properties = true; },
-         u" Where (1 > 0) And (1>0)"_s},
-        {"properties default AND",
-         [](MailingOptions& c, SessionState& s) {
-             c.properties = true;
-             s.QryGroupSel[1] = s.QryGroupSel[64] = true;
-         },
-         u" Where (1 > 0) And (OCRD.QryGroup1='Y' AND OCRD.QryGroup64='Y')"_s},
-        {"free SQL empty", [](MailingOptions& c, SessionState&) { c.sqlWhere = true; }, u" Where (1 > 0)"_s},
-        {"free SQL as typed",
-         [](MailingOptions& c, SessionState&) {
-             c.sqlWhere = true;
-             c.sqlWhereText = u"OCRD.Notes LIKE 'x%'"_s;
-         },
-         u" Where (1 > 0) And OCRD.Notes LIKE 'x%'"_s},
+        {{u"ChkDates=1"_s, u"TxtFromDate=15/6/2004"_s, u"TxtToDate=5/3/05"_s, u"CmbDocType=6"_s, u"cmbByDoc=1"_s},
+         u" Where (1 > 0) AND OCRD.CardCode Not In (Select Distinct VendorCode From OCHO Where OCHO.PmntDate Between "
+         "'06/15/2004' And '03/05/2005')"_s},
+        {{u"ChkDates=1"_s, u"cmbByDoc=-1"_s}, u" Where (1 > 0)"_s},
+        {{u"ChkItems=1"_s, u"txtFromItem=A'1"_s, u"txtToItem=B"_s},
+         u" Where (1 > 0) AND (OCRD.CardCode IN (SELECT CardCode FROM OINV, INV1 Where INV1.DocEntry = OINV.DocEntry "
+         "And INV1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode) OR OCRD.CardCode IN (SELECT CardCode FROM "
+         "ORIN, RIN1 Where RIN1.DocEntry = ORIN.DocEntry And RIN1.ItemCode Between N'A''1' And N'B' GROUP BY CardCode))"_s},
+        {{u"chkQryGroup=1"_s}, u" Where (1 > 0) And (1>0)"_s},
+        {{u"ChkUseSQLW=1"_s}, u" Where (1 > 0)"_s},
+        {{u"ChkUseSQLW=1"_s, u"txtSQLWhere=OCRD.Notes LIKE 'x%'"_s}, u" Where (1 > 0) And OCRD.Notes LIKE 'x%'"_s},
     };
-    for (const WhereCase& c : cases) {
-        MailingOptions criteria;
-        SessionState state;
-        c.set(criteria, state);
-        EXPECT_EQ(BuildWhere(criteria, state), c.expected) << c.name;
-    }
+    for (const auto& [assignments, expected] : cases)
+        EXPECT_EQ(BuildWhere(optionsWith(assignments), SessionState{}), expected)
+            << assignments.join(u' ').toStdString();
+
+    MailingOptions agent = optionsWith({u"ChkAgent=1"_s});
+    agent.agents = {{u"ללא"_s, -1}, {u"דנה"_s, 7}};
+    agent.agentIndex = 1;
+    EXPECT_EQ(BuildWhere(agent, SessionState{}), u" Where (1 > 0) AND OCRD.SlpCode = 7"_s);
+    SessionState properties;
+    properties.QryGroupSel[1] = properties.QryGroupSel[64] = true;
+    EXPECT_EQ(BuildWhere(optionsWith({u"chkQryGroup=1"_s}), properties),
+              u" Where (1 > 0) And (OCRD.QryGroup1='Y' AND OCRD.QryGroup64='Y')"_s)
+        << "the relation is AND until one is chosen";
 }
 
 TEST(StatementText, ACriterionThatCannotBeReadIsNamedInsteadOfBreakingTheStatement)
 {
-    const std::pair<std::function<void(MailingOptions&)>, QString> cases[] = {
-        {[](MailingOptions& c) { c.agent = true; }, u"סוכן"_s},
-        {[](MailingOptions& c) {
-             c.dates = true;
-             c.fromDate = u"yesterday"_s;
-             c.toDate = u"1/1/05"_s;
-         },
-         u"yesterday"_s},
-        {[](MailingOptions& c) {
-             c.dates = true;
-             c.fromDate = u"1/1/05"_s;
-             c.toDate = u"1/1/05"_s;
-             c.fromDocNum = u"1; DROP TABLE OCRD"_s;
-         },
-         u"1; DROP TABLE OCRD"_s},
-        {[](MailingOptions& c) {
-             c.dates = true;
-             c.fromDate = u"1/1/05"_s;
-             c.toDate = u"1/1/05"_s;
-             c.toDocNum = u"12.5"_s;
-         },
-         u"12.5"_s},
+    const QString dates = u"ChkDates=1|TxtFromDate=1/1/05|TxtToDate=1/1/05|"_s;
+    const std::pair<QString, QString> cases[] = {
+        {u"ChkAgent=1"_s, u"נבחר סינון לפי סוכן, אך לא נבחר סוכן מהרשימה. יש לבחור סוכן או לבטל את הסינון."_s},
+        {u"ChkDates=1|TxtFromDate=yesterday"_s,
+         u"התאריך \"yesterday\" אינו תקין. יש לכתוב תאריך בצורה יום/חודש/שנה, למשל 15/06/2004."_s},
+        {dates + u"txtFromDocNum=1; DROP TABLE OCRD"_s,
+         u"מספר המסמך הראשון \"1; DROP TABLE OCRD\" אינו מספר שלם. יש לתקן את טווח מספרי המסמכים."_s},
+        {dates + u"txtToDocNum=12.5"_s, u"מספר המסמך האחרון \"12.5\" אינו מספר שלם. יש לתקן את טווח מספרי המסמכים."_s},
+        {dates + u"txtToDocNum=1234567890123456789"_s,
+         u"מספר המסמך האחרון \"1234567890123456789\" אינו מספר שלם. יש לתקן את טווח מספרי המסמכים."_s},
     };
-    for (const auto& [set, named] : cases) {
-        MailingOptions criteria;
-        set(criteria);
-        try {
-            BuildWhere(criteria, SessionState{});
-            ADD_FAILURE() << named.toStdString();
-        } catch (const Failure& failure) {
-            EXPECT_TRUE(failure.description().contains(named)) << failure.description().toStdString();
-        }
-    }
+    for (const auto& [assignments, message] : cases)
+        EXPECT_EQ(failureOf([&] { BuildWhere(optionsWith(assignments.split(u'|')), SessionState{}); }), message);
+    EXPECT_TRUE(BuildWhere(optionsWith((dates + u"txtToDocNum= -123456789012345678 "_s).split(u'|')), SessionState{})
+                    .endsWith(u"DocNum<=-123456789012345678"_s))
+        << "eighteen digits and a sign are a whole number";
 }
 
 TEST(StatementText, DatesAreReadDayFirstWithTwoDigitYearsAndRollOver)
