@@ -24,12 +24,7 @@ QStringList texts(const CheckListModel& model, int textIndex = 0)
 
 class CardFileTest : public Isolated {
 protected:
-    QString file(const QByteArray& bytes)
-    {
-        const QString name = path(u"cards.txt"_s);
-        writeFile(name, bytes);
-        return name;
-    }
+    QString file(const QByteArray& bytes) const { return fileWith(u"cards.txt"_s, bytes); }
 };
 
 TEST_F(CardFileTest, FieldsAreCutAtTabsWithTheFallbacksOfShortLines)

@@ -24,6 +24,12 @@ void Isolated::TearDown()
         qputenv("Temp", savedTemp_);
 }
 
+QString Isolated::fileWith(const QString& name, const QByteArray& bytes) const
+{
+    writeFile(path(name), bytes);
+    return path(name);
+}
+
 QByteArray readFile(const QString& path)
 {
     QFile file(path);

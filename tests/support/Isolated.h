@@ -20,6 +20,8 @@ protected:
     QString path(const QString& name) const { return dir_.filePath(name); }
     QString configFolder() const { return path(QStringLiteral("config/Pelmar")); }
     QString tempPath(const QString& name) const { return path(QStringLiteral("temp/") + name); }
+    // Writes a file of the test's own folder and returns its path.
+    QString fileWith(const QString& name, const QByteArray& bytes) const;
 
 private:
     QTemporaryDir dir_;

@@ -215,12 +215,7 @@ TEST_F(PickersTest, NoToTheRescanQuestionKeepsThePickerAndItsMarks)
 
 class CardFileTest : public MainCardTest {
 protected:
-    QString file(const QByteArray& bytes)
-    {
-        const QString name = path(u"cards.txt"_s);
-        writeFile(name, bytes);
-        return name;
-    }
+    QString file(const QByteArray& bytes) const { return fileWith(u"cards.txt"_s, bytes); }
 };
 
 TEST_F(CardFileTest, TheDialogReadsCountsAndCopiesOnOkWithItsOptionsSaved)
