@@ -8,6 +8,7 @@
 
 #include <cstdio>
 #include <functional>
+#include <poll.h>
 #include <pty.h>
 #include <unistd.h>
 
@@ -39,10 +40,17 @@ QByteArray written(int stream, const std::function<void()>& work, bool terminal 
     ::close(saved);
     if (!terminal)
         return file.seek(0) ? file.readAll() : QByteArray();
+    QByteArray bytes;
+    pollfd ready{reader, POLLIN, 0};
     char buffer[512];
-    const ssize_t size = ::read(reader, buffer, sizeof buffer);
+    while (::poll(&ready, 1, 200) > 0) {
+        const ssize_t size = ::read(reader, buffer, sizeof buffer);
+        if (size <= 0)
+            break;
+        bytes.append(buffer, size);
+    }
     ::close(reader);
-    return QByteArray(buffer, std::max<ssize_t>(0, size));
+    return bytes;
 }
 
 TEST(Console, MessagesGoToStandardErrorWithTheirTitlesAndACriticalOneFailsTheCommand)

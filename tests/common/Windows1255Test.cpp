@@ -94,6 +94,8 @@ TEST_F(TextFileWriterTest, ValuesAreEscapedAsTheirModeSaysAndMarkupIsNot)
                       }),
               QByteArray("<b>a&amp;b &lt;c&gt; &quot;d&quot;, e\rf&#128512;g\r\n1,2<br>3\r\n1<br>2<br>3\r\n"));
     EXPECT_EQ(written(false, [](TextFileWriter& file) { file.line(u"05😀2 日"_s); }), QByteArray("05?2 ?\r\n"));
+    EXPECT_EQ(written(true, [](TextFileWriter& file) { file.put(u"日<"_s, Html::Text); }), QByteArray("&#26085;&lt;"))
+        << "a character after one the code page lacks is escaped still";
 }
 
 TEST_F(TextFileWriterTest, AnEarlierFileIsReplacedAndLongOutputsKeepEveryByte)

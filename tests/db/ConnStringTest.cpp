@@ -1,7 +1,8 @@
 #include "db/ConnString.h"
 #include "db/ConnectionTarget.h"
-#include "support/QtPrinting.h"
+#include "db/OdbcDrivers.h"
 #include "support/FailureOf.h"
+#include "support/QtPrinting.h"
 
 #include <gtest/gtest.h>
 
@@ -82,6 +83,20 @@ TEST(ConnectionTarget, EveryKindBecomesAnOdbcStringThatQuotesWhatNeedsIt)
     };
     for (const TargetCase& c : cases)
         EXPECT_EQ(ConnectionTarget::parse(c.connString).odbcString(c.driver), c.odbc) << c.connString.toStdString();
+}
+
+TEST(SqlServerDriver, TheEnvironmentThenTheSettingThenMicrosoftsNewestThenFreeTds)
+{
+    const QString ms18 = u"ODBC Driver 18 for SQL Server"_s;
+    const QString ms17 = u"ODBC Driver 17 for SQL Server"_s;
+    qunsetenv("PELMAR_SQLSERVER_DRIVER");
+    EXPECT_EQ(chooseSqlServerDriver({}, {u"PostgreSQL Unicode"_s}), u"FreeTDS"_s);
+    EXPECT_EQ(chooseSqlServerDriver({}, {ms17, u"FreeTDS"_s}), ms17);
+    EXPECT_EQ(chooseSqlServerDriver({}, {ms17, ms18}), ms18);
+    EXPECT_EQ(chooseSqlServerDriver(u"Mine"_s, {ms18}), u"Mine"_s);
+    qputenv("PELMAR_SQLSERVER_DRIVER", "From the environment");
+    EXPECT_EQ(chooseSqlServerDriver(u"Mine"_s, {ms18}), u"From the environment"_s);
+    qunsetenv("PELMAR_SQLSERVER_DRIVER");
 }
 
 TEST(ConnectionTarget, ASqliteServerNamesTheEmbeddedFolder)
