@@ -44,23 +44,6 @@ TEST_F(Initialisation, AConfiguredCompanyFillsTheSalesEmployees)
     EXPECT_EQ(c().CmbAgent->currentIndex(), 0) << "the stored agent index 0 is loaded after the list is filled";
 }
 
-TEST_F(Initialisation, TheUnconfiguredDatabaseIsNeverTried)
-{
-    engine->createCompany(u"tarvel02"_s, CompanyOptions{});
-    pointAt(u"tarvel02"_s);
-    card->UserControl_Initialize();
-    EXPECT_EQ(c().CmbAgent->count(), 0);
-}
-
-TEST_F(Initialisation, AnUnreachableCompanyLeavesTheControlUsable)
-{
-    pointAt(u"nosuchcompany"_s);
-    card->UserControl_Initialize();
-    EXPECT_EQ(c().CmbAgent->count(), 0);
-    EXPECT_TRUE(messages.boxes.isEmpty());
-    EXPECT_EQ(control<QLineEdit>(u"txtRows"_s)->text(), u"8"_s);
-}
-
 TEST_F(Initialisation, ClosingTheLogonDialogReloadsTheStoredSettingsAndEmptiesTheLog)
 {
     card->UserControl_Initialize();

@@ -149,20 +149,14 @@ TEST_F(MainCardTest, TheProgressDisplayShowsTheTextAndTheShareOfTheFrame)
     EXPECT_EQ(c().ProgressFill->width(), 0);
 }
 
-TEST_F(MainCardTest, InitialisationLoadsTheOptionsAndShowsTheCriteriaPage)
+TEST_F(MainCardTest, InitialisationShowsTheStoredOptionsAndTheCriteriaPage)
 {
     store->setValue(u"Pelmar"_s, u"Params"_s, u"DeptField"_s, u"1"_s);
     store->setValue(u"Pelmar"_s, u"Params"_s, u"Rows"_s, u"10"_s);
-    state.SelCardGroups = {CardGroupSel{}, CardGroupSel{100, true}};
-    state.CardListSQL = u"SELECT 1"_s;
     card->UserControl_Initialize();
-    EXPECT_EQ(card->options().rows, u"10"_s);
+    EXPECT_EQ(control<QLineEdit>(u"txtRows"_s)->text(), u"10"_s);
     EXPECT_EQ(c().LblDept->text(), u"תפקיד"_s);
     EXPECT_EQ(c().SSTab1->currentIndex(), 3);
-    EXPECT_EQ(state.SelCardGroups.size(), 1);
-    EXPECT_TRUE(state.CardListSQL.isEmpty());
-    EXPECT_EQ(state.ConnDataBase, u"tarvel02"_s);
-    EXPECT_EQ(state.ConnServer, u"server"_s);
     EXPECT_TRUE(messages.boxes.isEmpty());
 }
 
