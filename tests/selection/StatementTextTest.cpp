@@ -84,8 +84,13 @@ TEST(StatementText, EachCriterionAddsItsFragmentInOrder)
 
     MailingOptions agent = optionsWith({u"ChkAgent=1"_s});
     agent.agents = {{u"ללא"_s, -1}, {u"דנה"_s, 7}};
+    agent.agentIndex = 0;
+    EXPECT_EQ(BuildWhere(agent, SessionState{}), u" Where (1 > 0) AND OCRD.SlpCode = -1"_s) << "the first entry";
     agent.agentIndex = 1;
-    EXPECT_EQ(BuildWhere(agent, SessionState{}), u" Where (1 > 0) AND OCRD.SlpCode = 7"_s);
+    EXPECT_EQ(BuildWhere(agent, SessionState{}), u" Where (1 > 0) AND OCRD.SlpCode = 7"_s) << "the last entry";
+    agent.agentIndex = 2;
+    EXPECT_EQ(failureOf([&] { BuildWhere(agent, SessionState{}); }),
+              u"נבחר סינון לפי סוכן, אך לא נבחר סוכן מהרשימה. יש לבחור סוכן או לבטל את הסינון."_s);
     SessionState properties;
     properties.QryGroupSel[1] = properties.QryGroupSel[64] = true;
     EXPECT_EQ(BuildWhere(optionsWith({u"chkQryGroup=1"_s}), properties),

@@ -1,6 +1,8 @@
 #include "common/Failure.h"
+#include "options/MailingOptions.h"
 #include "selection/CheckListModel.h"
 #include "selection/PickerData.h"
+#include "selection/SalesEmployees.h"
 #include "support/Engines.h"
 #include "support/FailureOf.h"
 #include "support/Isolated.h"
@@ -83,6 +85,34 @@ public:
                  {u"d"_s, {u"3.5"_s, u"Gamma"_s}}});
     }
 };
+
+TEST(SalesEmployees, TheListIsRefilledFromTheTableAndKeptWhenTheTableIsEmpty)
+{
+    const auto engine = makeSqliteEngine();
+    const auto company = [&](const QString& name, const QStringList& rows) {
+        engine->createDatabase(name, QStringList{u"CREATE TABLE OSLP (SlpCode INTEGER, SlpName VARCHAR(30))"_s} + rows);
+        return engine->connString(name);
+    };
+    MailingOptions options;
+    options.agents = {{u"old"_s, 9}};
+    FillCmbAgent(engine->client(),
+                 company(u"sales"_s,
+                         {u"INSERT INTO OSLP VALUES (4, ' דנה ')"_s, u"INSERT INTO OSLP VALUES (2, '')"_s,
+                          u"INSERT INTO OSLP VALUES (3, NULL)"_s, u"INSERT INTO OSLP VALUES (1, 'Yossi')"_s}),
+                 options);
+    const QList<SalesEmployee> employees = {{u"דנה"_s, 4}, {u"Yossi"_s, 1}};
+    EXPECT_EQ(options.agents, employees) << "in the table's order, trimmed, the nameless left out";
+    EXPECT_EQ(options.agentIndex, 0);
+    options.agentIndex = 1;
+    FillCmbAgent(engine->client(), company(u"none"_s, {}), options);
+    EXPECT_EQ(options.agents, employees) << "an empty table keeps the list";
+    EXPECT_EQ(options.agentIndex, 1);
+    FillCmbAgent(engine->client(), engine->connString(u"missing"_s), options);
+    EXPECT_EQ(options.agents, employees) << "so does a database that cannot be read";
+    FillCmbAgent(engine->client(), company(u"nameless"_s, {u"INSERT INTO OSLP VALUES (5, '  ')"_s}), options);
+    EXPECT_TRUE(options.agents.isEmpty());
+    EXPECT_EQ(options.agentIndex, -1) << "a list of no names has nothing chosen";
+}
 
 TEST(CheckListModel, TextsSortWithNumbersByValueFirstThenWithoutRegardToCase)
 {
