@@ -66,26 +66,39 @@ struct CommandLineUse {
     bool fileRequired = false;  // -o FILE must be given: the output asks for its file
 };
 
+// What the program shows of an output before it runs it.
+struct OutputDescription {
+    // The command that runs it on the command line; empty for one that has none.
+    QString name{};
+    // The output kind (2..6) by which cmbOutType chooses it (list position + 2); 0 for an output
+    // that the list does not offer.
+    short kind = 0;
+    // The question the run button asks before starting it, and the message shown when its run
+    // returns (also after a stop); empty for none.
+    QString question{};
+    QString finishMessage{};
+    CommandLineUse commandLine{};
+};
+
 // One output of the program: the label sheet, the recipient list, the SMS list, the card page,
 // and (through the run button) letters, faxes and e-mail.
 class Output {
 public:
+    explicit Output(OutputDescription description) : description_(std::move(description)) {}
     virtual ~Output() = default;
 
-    // The command that runs it on the command line; empty for one that has none.
-    virtual QString name() const = 0;
-    // The output kind (2..6) by which cmbOutType chooses it (list position + 2); 0 for an output
-    // that the list does not offer.
-    virtual short kind() const = 0;
-    // The question the run button asks before starting it, and the message shown when its run
-    // returns (also after a stop); empty for none.
-    virtual QString question() const = 0;
-    virtual QString finishMessage() const = 0;
-    virtual CommandLineUse commandLine() const = 0;
+    const QString& name() const { return description_.name; }
+    short kind() const { return description_.kind; }
+    const QString& question() const { return description_.question; }
+    const QString& finishMessage() const { return description_.finishMessage; }
+    const CommandLineUse& commandLine() const { return description_.commandLine; }
 
     // Runs the output. Throws Failure with the description the user is shown; what was written
     // before the failure stays.
     virtual void run(RunContext& context) const = 0;
+
+private:
+    OutputDescription description_;
 };
 
 // Every output, those the run button offers first, in the order of cmbOutType.

@@ -18,24 +18,24 @@ using Argument = CommandLineUse::Argument;
 
 class LabelSheetOutput : public Output {
 public:
-    QString name() const override { return u"labels"_s; }
-    short kind() const override { return 2; }
-    QString question() const override { return u"להתחיל בהכנת המדבקות?"_s; }
-    QString finishMessage() const override { return {}; }
-    CommandLineUse commandLine() const override
-    {
-        return {u"labels [-o FILE] [--open]"_s, u"the label sheet (default: pelmar1.htm in the temporary folder)"_s};
-    }
+    LabelSheetOutput()
+        : Output({.name = u"labels"_s,
+                  .kind = 2,
+                  .question = u"להתחיל בהכנת המדבקות?"_s,
+                  .commandLine = {u"labels [-o FILE] [--open]"_s,
+                                  u"the label sheet (default: pelmar1.htm in the temporary folder)"_s}})
+    {}
     void run(RunContext& context) const override { RunLabels(context); }
 };
 
 class SmsListOutput : public Output {
 public:
-    QString name() const override { return u"sms"_s; }
-    short kind() const override { return 5; }
-    QString question() const override { return u"להתחיל בהכנת קובץ למשלוח הודעות לסלולריים?"_s; }
-    QString finishMessage() const override { return {}; }
-    CommandLineUse commandLine() const override { return {u"sms -o FILE"_s, u"the SMS list"_s, Argument::None, true}; }
+    SmsListOutput()
+        : Output({.name = u"sms"_s,
+                  .kind = 5,
+                  .question = u"להתחיל בהכנת קובץ למשלוח הודעות לסלולריים?"_s,
+                  .commandLine = {u"sms -o FILE"_s, u"the SMS list"_s, Argument::None, true}})
+    {}
     void run(RunContext& context) const override { SaveSMSList(context); }
 };
 
@@ -43,15 +43,11 @@ public:
 // requested kind.
 class RecipientListOutput : public Output {
 public:
-    QString name() const override { return u"list"_s; }
-    short kind() const override { return 0; }
-    QString question() const override { return {}; }
-    QString finishMessage() const override { return {}; }
-    CommandLineUse commandLine() const override
-    {
-        return {u"list [--kind 2..6] [-o FILE] [--open]"_s,
-                u"the recipient list (default kind: the chosen output type)"_s, Argument::Kind};
-    }
+    RecipientListOutput()
+        : Output({.name = u"list"_s,
+                  .commandLine = {u"list [--kind 2..6] [-o FILE] [--open]"_s,
+                                  u"the recipient list (default kind: the chosen output type)"_s, Argument::Kind}})
+    {}
     void run(RunContext& context) const override
     {
         const QString path = runFile(context, u"pelmar2.htm"_s);
@@ -63,15 +59,12 @@ public:
 // The page of the card the card picker opens.
 class CardPageOutput : public Output {
 public:
-    QString name() const override { return u"card"_s; }
-    short kind() const override { return 0; }
-    QString question() const override { return {}; }
-    QString finishMessage() const override { return {}; }
-    CommandLineUse commandLine() const override
-    {
-        return {u"card CODE [-o FILE] [--open]"_s, u"the card page (default: pelmar3.htm in the temporary folder)"_s,
-                Argument::CardCode};
-    }
+    CardPageOutput()
+        : Output(
+            {.name = u"card"_s,
+             .commandLine = {u"card CODE [-o FILE] [--open]"_s,
+                             u"the card page (default: pelmar3.htm in the temporary folder)"_s, Argument::CardCode}})
+    {}
     void run(RunContext& context) const override
     {
         const QString path = runFile(context, u"pelmar3.htm"_s);
@@ -84,21 +77,13 @@ public:
 // so no finish message follows.
 class UnavailableOutput : public Output {
 public:
-    UnavailableOutput(short kind, QString question) : kind_(kind), question_(std::move(question)) {}
-    QString name() const override { return {}; }
-    short kind() const override { return kind_; }
-    QString question() const override { return question_; }
-    QString finishMessage() const override { return {}; }
-    CommandLineUse commandLine() const override { return {}; }
+    UnavailableOutput(short kind, const QString& question) : Output({.kind = kind, .question = question}) {}
     void run(RunContext& context) const override
     {
         context.services.messages.information(
-            u"הודעה"_s, u"הפלט \"%1\" עדיין אינו זמין בגרסה זו. לא בוצע דבר."_s.arg(outputTypeEntries().at(kind_ - 2)));
+            u"הודעה"_s,
+            u"הפלט \"%1\" עדיין אינו זמין בגרסה זו. לא בוצע דבר."_s.arg(outputTypeEntries().at(kind() - 2)));
     }
-
-private:
-    short kind_;
-    QString question_;
 };
 
 }  // namespace
