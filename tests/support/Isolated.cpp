@@ -11,13 +11,16 @@ void Isolated::SetUp()
     QDir().mkpath(path(QStringLiteral("temp")));
     savedConfig_ = qgetenv("XDG_CONFIG_HOME");
     savedTemp_ = qgetenv("Temp");
+    savedData_ = qgetenv("XDG_DATA_HOME");
     qputenv("XDG_CONFIG_HOME", path(QStringLiteral("config")).toUtf8());
+    qputenv("XDG_DATA_HOME", path(QStringLiteral("data")).toUtf8());
     qputenv("Temp", path(QStringLiteral("temp")).toUtf8());
 }
 
 void Isolated::TearDown()
 {
     qputenv("XDG_CONFIG_HOME", savedConfig_);
+    qputenv("XDG_DATA_HOME", savedData_);
     if (savedTemp_.isEmpty())
         qunsetenv("Temp");
     else

@@ -9,8 +9,8 @@
 
 namespace pelmar::test {
 
-// A test with a folder of its own: the settings store ($XDG_CONFIG_HOME) and the temporary
-// folder (Temp) point into it while the test runs.
+// A test with a folder of its own: the settings store ($XDG_CONFIG_HOME), the data folder
+// ($XDG_DATA_HOME) and the temporary folder (Temp) point into it while the test runs.
 class Isolated : public ::testing::Test {
 protected:
     void SetUp() override;
@@ -27,6 +27,7 @@ private:
     QTemporaryDir dir_;
     QByteArray savedConfig_;
     QByteArray savedTemp_;
+    QByteArray savedData_;
 };
 
 // Reads a whole file; empty when it cannot be read.
