@@ -114,6 +114,9 @@ void runOutput(const Output& output, const CommandLine& line, const MailingOptio
         request.kind = static_cast<short>(*line.kind);
     RunContext context{options, state, services, progress, stop, request};
     output.run(context);
+    const QString finish = finishText(output, context);
+    if (!finish.isEmpty())
+        services.messages.information(u"הודעה"_s, finish);
 }
 
 int runDemo(const CommandLine& line)

@@ -10,6 +10,7 @@
 
 #include <functional>
 #include <memory>
+#include <optional>
 
 namespace pelmar {
 
@@ -71,8 +72,9 @@ private:
     void connectHandlers();
     void showOptions();
     void showDeptCaption();
-    // Runs an output on a copy of the options; false when it failed (the failure was shown).
-    bool runOutput(const Output& output, const RunRequest& request);
+    // Runs an output on a copy of the options; its finish text when it returned, nothing when
+    // a failure ended it (the failure was shown).
+    std::optional<QString> runOutput(const Output& output, const RunRequest& request);
     bool guarded(const std::function<void()>& handler);
     QString PickOpenFile(int index);
     void openCardPage(const QString& code);

@@ -16,8 +16,9 @@ void MainCard::CmdLabPrev_Click()
     const Output& output = outputChosenAt(options_.outType);
     if (!services_.messages.question(u"שאלה חשובה"_s, output.question()))
         return;
-    if (runOutput(output, {}) && !output.finishMessage().isEmpty())
-        services_.messages.information(u"הודעה"_s, output.finishMessage());
+    const std::optional<QString> finish = runOutput(output, {});
+    if (finish && !finish->isEmpty())
+        services_.messages.information(u"הודעה"_s, *finish);
 }
 
 void MainCard::CmdPreview_Click()
@@ -30,12 +31,14 @@ void MainCard::openCardPage(const QString& code)
     runOutput(*outputNamed(u"card"_s), RunRequest{{}, {}, code});
 }
 
-bool MainCard::runOutput(const Output& output, const RunRequest& request)
+std::optional<QString> MainCard::runOutput(const Output& output, const RunRequest& request)
 {
     const MailingOptions snapshot = options_;
     StopToken stop(state_.StopRequested, [] { QCoreApplication::processEvents(); });
     RunContext context{snapshot, state_, services_, *this, stop, request};
-    return guarded([&] { output.run(context); });
+    if (!guarded([&] { output.run(context); }))
+        return std::nullopt;
+    return finishText(output, context);
 }
 
 bool MainCard::guarded(const std::function<void()>& handler)

@@ -63,6 +63,13 @@ const QStringList& addressSourceEntries()
     return entries;
 }
 
+const QStringList& smtpSecurityEntries()
+{
+    static const QStringList entries
+        = {u"הצפנה (STARTTLS) כשהשרת מציע"_s, u"הצפנה (STARTTLS) חובה"_s, u"הצפנה מלאה (TLS) מההתחלה"_s};
+    return entries;
+}
+
 const QList<MergeRow>& mergeRows()
 {
     static const QList<MergeRow> rows = {

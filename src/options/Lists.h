@@ -17,6 +17,7 @@ const QStringList& sortByEntries();  // CmbSortBy
 const QStringList& sortDirectionEntries();  // CmbSortDir
 const QStringList& labelTemplateEntries();  // cmbLabFormat
 const QStringList& addressSourceEntries();  // cmbAddressFrom
+const QStringList& smtpSecurityEntries();  // cmbSmtpSecurity
 
 // A row of the letters page's merge table: the form field of the template it fills and, for
 // the fixed rows 0..3, its caption and the recipient column behind it. Rows 4..7 are free rows:

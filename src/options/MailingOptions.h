@@ -91,6 +91,13 @@ struct MailingOptions {
     QString emailToMain = QStringLiteral("lakohot@pelmar.co.il");
     QString emailToMainDesc = QStringLiteral("לקוחות טרבל");
 
+    // E-mail page, the outgoing mail server.
+    QString smtpServer = QStringLiteral("localhost");
+    QString smtpPort = QStringLiteral("25");
+    int smtpSecurity = 0;  // cmbSmtpSecurity: 0 STARTTLS when offered, 1 STARTTLS required, 2 TLS
+    QString smtpUser;  // empty: no authentication
+    QString smtpPassword;
+
     bool operator==(const MailingOptions&) const = default;
 };
 

@@ -150,7 +150,12 @@ void addStoredOptions(QList<OptionBinding>& all)
         << textOption(u"txtEmailToMain", u"EmailToMain", &MailingOptions::emailToMain)
         << textOption(u"txtEmailToMainDesc", u"EmailToMainDesc", &MailingOptions::emailToMainDesc)
         << choiceOption(u"OptEmailMethod_1"_s, u"OptEmailMethod1"_s, &MailingOptions::emailMethod, 1)
-        << choiceOption(u"OptEmailMethod_2"_s, u"OptEmailMethod2"_s, &MailingOptions::emailMethod, 2);
+        << choiceOption(u"OptEmailMethod_2"_s, u"OptEmailMethod2"_s, &MailingOptions::emailMethod, 2)
+        << textOption(u"txtSmtpServer", u"SmtpServer", &MailingOptions::smtpServer)
+        << textOption(u"txtSmtpPort", u"SmtpPort", &MailingOptions::smtpPort)
+        << listOption(u"cmbSmtpSecurity", u"SmtpSecurity", &MailingOptions::smtpSecurity, &smtpSecurityEntries)
+        << textOption(u"txtSmtpUser", u"SmtpUser", &MailingOptions::smtpUser)
+        << textOption(u"txtSmtpPassword", u"SmtpPassword", &MailingOptions::smtpPassword);
 }
 
 void addPageOptions(QList<OptionBinding>& all)

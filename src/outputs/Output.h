@@ -54,6 +54,9 @@ struct RunContext {
     ProgressSink& progress;
     StopToken& stop;
     RunRequest request;
+    // What the run adds to its finish message (how many it sent, how many it dropped); empty
+    // for nothing.
+    QString outcome{};
 };
 
 // What the command line needs to know to run an output.
@@ -100,6 +103,10 @@ public:
 private:
     OutputDescription description_;
 };
+
+// The message shown when the output's run returns: its finish message and the run's outcome on
+// a line of its own; empty for an output that has none.
+QString finishText(const Output& output, const RunContext& context);
 
 // Every output, those the run button offers first, in the order of cmbOutType.
 const QList<const Output*>& outputTable();

@@ -2,6 +2,8 @@
 #include "common/Messages.h"
 #include "options/Lists.h"
 #include "options/MailingOptions.h"
+#include "outputs/EmailCampaign.h"
+#include "outputs/MailJournal.h"
 #include "outputs/Output.h"
 #include "outputs/RunSupport.h"
 #include "outputs/Runs.h"
@@ -73,6 +75,24 @@ public:
     }
 };
 
+// The e-mail campaign, through the outgoing mail server of the options.
+class EmailOutput : public Output {
+public:
+    EmailOutput()
+        : Output({.name = u"email"_s,
+                  .kind = 4,
+                  .question = u"להתחיל במשלוח דואר אלקטרוני?"_s,
+                  .finishMessage = u"הדיוור האלקטרוני הסתיים"_s,
+                  .commandLine
+                  = {u"email [--yes]"_s, u"the e-mail campaign, through the outgoing mail server of the options"_s}})
+    {}
+    void run(RunContext& context) const override
+    {
+        SmtpTransport transport(smtpServerOf(context.options));
+        SendEmailCampaign(context, transport, MailJournal::userFolder());
+    }
+};
+
 // An output of the run button that this version does not have yet: it says so and does nothing,
 // so no finish message follows.
 class UnavailableOutput : public Output {
@@ -92,13 +112,20 @@ const QList<const Output*>& outputTable()
 {
     static const LabelSheetOutput labels;
     static const UnavailableOutput fax(3, u"להתחיל במשלוח הפקסים?"_s);
-    static const UnavailableOutput email(4, u"להתחיל במשלוח דואר אלקטרוני?"_s);
+    static const EmailOutput email;
     static const SmsListOutput sms;
     static const UnavailableOutput letters(6, u"להתחיל בהדפסת המכתבים?"_s);
     static const RecipientListOutput list;
     static const CardPageOutput card;
     static const QList<const Output*> table = {&labels, &fax, &email, &sms, &letters, &list, &card};
     return table;
+}
+
+QString finishText(const Output& output, const RunContext& context)
+{
+    if (output.finishMessage().isEmpty() || context.outcome.isEmpty())
+        return output.finishMessage();
+    return output.finishMessage() + u'\n' + context.outcome;
 }
 
 short chosenOutputKind(int listIndex)

@@ -1,8 +1,10 @@
 #include "control/MainCardControls.h"
 #include "control/pages/Pages.h"
+#include "options/Lists.h"
 #include "widgets/Widgets.h"
 
 #include <QButtonGroup>
+#include <QComboBox>
 #include <QGridLayout>
 #include <QGroupBox>
 #include <QHBoxLayout>
@@ -93,6 +95,34 @@ QGroupBox* buildRecipients()
     return group;
 }
 
+// Where the messages go out: the server, its port and security, and the account when the server
+// asks for one. The password is masked; it is kept in the settings store, which only its owner
+// can read.
+QGroupBox* buildServer()
+{
+    QGridLayout* grid = nullptr;
+    QGroupBox* group = groupBox(u"שרת דואר יוצא"_s, grid);
+    auto* txtSmtpServer = addressBox(u"txtSmtpServer"_s);
+    auto* txtSmtpPort = addressBox(u"txtSmtpPort"_s);
+    txtSmtpPort->setMaximumWidth(60);
+    auto* txtSmtpUser = addressBox(u"txtSmtpUser"_s);
+    auto* txtSmtpPassword = addressBox(u"txtSmtpPassword"_s);
+    txtSmtpPassword->setEchoMode(QLineEdit::Password);
+    grid->addWidget(caption(u"שרת:"_s), 0, 0);
+    grid->addWidget(txtSmtpServer, 0, 1);
+    grid->addWidget(caption(u"פורט:"_s), 0, 2);
+    grid->addWidget(txtSmtpPort, 0, 3);
+    grid->addWidget(caption(u"אבטחה:"_s), 0, 4);
+    grid->addWidget(listBox(u"cmbSmtpSecurity"_s, smtpSecurityEntries()), 0, 5);
+    grid->addWidget(caption(u"משתמש:"_s), 1, 0);
+    grid->addWidget(txtSmtpUser, 1, 1);
+    grid->addWidget(caption(u"סיסמה:"_s), 1, 2);
+    grid->addWidget(txtSmtpPassword, 1, 3, 1, 3);
+    grid->setColumnStretch(1, 2);
+    grid->setColumnStretch(5, 1);
+    return group;
+}
+
 }  // namespace
 
 QWidget* buildEmailPage(MainCardControls& c)
@@ -101,6 +131,7 @@ QWidget* buildEmailPage(MainCardControls& c)
     auto* layout = new QVBoxLayout(page);
     layout->addWidget(buildMessage(c));
     layout->addWidget(buildRecipients());
+    layout->addWidget(buildServer());
     layout->addStretch(1);
     return page;
 }
