@@ -5,9 +5,11 @@
 //
 //   pelmar_bench [--cards N,N,...] [--engines embedded,postgresql] [--outputs labels,...]
 //   pelmar_bench picker [CARDS]             the card picker's fill, sorts and search
+//   pelmar_bench mail [CARDS]               the e-mail campaign against a Python smtplib loop
 //   pelmar_bench generate FOLDER CARDS      an embedded company "bench" for profiling
 //   pelmar_bench measure floor|run OUTPUT DRIVER SERVER USER PASSWORD DATABASE   one measurement
 
+#include "bench/Mail.h"
 #include "bench/Outputs.h"
 #include "bench/Picker.h"
 #include "common/Failure.h"
@@ -179,6 +181,8 @@ int main(int argc, char* argv[])
     if (args.value(0) == u"picker"_s)
         return bench::measurePicker(args.value(1, u"100000"_s).toInt());
     try {
+        if (args.value(0) == u"mail"_s)
+            return bench::measureMail(args.value(1, u"11330"_s).toInt());
         return runAll(args);
     } catch (const Failure& failure) {
         QTextStream(stderr) << failure.description() << Qt::endl;
