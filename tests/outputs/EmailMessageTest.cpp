@@ -126,6 +126,17 @@ TEST_F(EmailMessageTest, StartTlsAndALoginReachAServerThatAsksForThem)
     EXPECT_EQ(messages.boxes.value(0).title, u"תקלה"_s);
 }
 
+TEST_F(EmailMessageTest, TlsFromTheStartReachesAServerThatSpeaksOnlyTls)
+{
+    SmtpSink::Options tls;
+    tls.implicitTls = true;
+    SmtpSink sink(tls);
+    qputenv("PELMAR_SMTP_CA_FILE", sink.certificateFile().toLocal8Bit());
+    options.smtpSecurity = 2;
+    sendOne(sink);
+    qunsetenv("PELMAR_SMTP_CA_FILE");
+}
+
 TEST_F(EmailMessageTest, StartTlsRequiredRefusesAServerWithoutIt)
 {
     SmtpSink plain;

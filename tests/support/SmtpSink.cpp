@@ -67,7 +67,7 @@ SmtpSink::SmtpSink(const Options& options) : dir_(QDir::tempPath() + QStringLite
 {
     if (!dir_.isValid())
         throw std::runtime_error("cannot create the SMTP sink's folder");
-    if (options.startTls)
+    if (options.startTls || options.implicitTls)
         makeCertificate();
     process_.setStandardOutputFile(dir_.filePath(QStringLiteral("stdout")));
     process_.setStandardErrorFile(dir_.filePath(QStringLiteral("stderr")));
@@ -109,9 +109,11 @@ QStringList SmtpSink::arguments(const Options& options) const
                           dir_.filePath(QStringLiteral("mail"))};
     for (const QString& address : options.refused)
         arguments << QStringLiteral("--refuse") << address;
-    if (options.startTls)
+    if (options.startTls || options.implicitTls)
         arguments << QStringLiteral("--tls-cert") << certificate_ << QStringLiteral("--tls-key")
                   << dir_.filePath(QStringLiteral("key.pem"));
+    if (options.implicitTls)
+        arguments << QStringLiteral("--implicit-tls");
     if (options.user.contains(u':'))
         throw std::invalid_argument("the SMTP sink's user may not contain a colon");
     if (!options.user.isEmpty())

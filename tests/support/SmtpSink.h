@@ -34,6 +34,8 @@ public:
         // Offers STARTTLS (without requiring it) with a self-signed certificate for 127.0.0.1 and
         // localhost; a client must trust certificateFile().
         bool startTls = false;
+        // Speaks TLS from the first byte instead (with the same certificate); no STARTTLS.
+        bool implicitTls = false;
         // A non-empty user makes AUTH PLAIN or LOGIN with these credentials required before MAIL,
         // with or without TLS; other credentials get 535. The user may not contain a colon.
         QString user, password;
@@ -53,7 +55,7 @@ public:
     SmtpSink& operator=(const SmtpSink&) = delete;
 
     int port() const { return port_; }
-    // The PEM certificate a client must trust when startTls is set; else empty.
+    // The PEM certificate a client must trust when startTls or implicitTls is set; else empty.
     QString certificateFile() const { return certificate_; }
     // Every accepted message, in the order accepted.
     QList<ReceivedMail> messages() const;

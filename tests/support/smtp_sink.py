@@ -89,24 +89,31 @@ def parse_arguments():
     parser.add_argument("--tls-cert")
     parser.add_argument("--tls-key")
     parser.add_argument("--require-tls", action="store_true")
+    parser.add_argument("--implicit-tls", action="store_true", help="TLS from the first byte, no STARTTLS")
     parser.add_argument("--auth", metavar="USER:PASSWORD")
     parser.add_argument("--accept-limit", type=int, default=-1, metavar="N")
     arguments = parser.parse_args()
     if bool(arguments.tls_cert) != bool(arguments.tls_key):
         parser.error("--tls-cert and --tls-key go together")
-    if arguments.require_tls and not arguments.tls_cert:
+    if (arguments.require_tls or arguments.implicit_tls) and not arguments.tls_cert:
         parser.error("--require-tls needs --tls-cert and --tls-key")
     if arguments.auth is not None and ":" not in arguments.auth:
         parser.error("--auth takes USER:PASSWORD")
     return arguments
 
 
+def tls_context(arguments):
+    if not arguments.tls_cert:
+        return None
+    context = ssl.create_default_context(ssl.Purpose.CLIENT_AUTH)
+    context.load_cert_chain(arguments.tls_cert, arguments.tls_key)
+    return context
+
+
 def session_options(arguments):
     options = {"hostname": "localhost", "enable_SMTPUTF8": True}
-    if arguments.tls_cert:
-        context = ssl.create_default_context(ssl.Purpose.CLIENT_AUTH)
-        context.load_cert_chain(arguments.tls_cert, arguments.tls_key)
-        options.update(tls_context=context, require_starttls=arguments.require_tls)
+    if arguments.tls_cert and not arguments.implicit_tls:
+        options.update(tls_context=tls_context(arguments), require_starttls=arguments.require_tls)
     if arguments.auth is not None:
         user, password = arguments.auth.split(":", 1)
         expected = (user.encode(), password.encode())
@@ -131,7 +138,8 @@ async def serve(arguments):
         recorder.count_connection()
         return Session(recorder, arguments.accept_limit, loop=loop, **options)
 
-    server = await loop.create_server(new_session, host="127.0.0.1", port=arguments.port)
+    implicit = tls_context(arguments) if arguments.implicit_tls else None
+    server = await loop.create_server(new_session, host="127.0.0.1", port=arguments.port, ssl=implicit)
     stopped = loop.create_future()
     for signal_number in (signal.SIGTERM, signal.SIGINT):
         loop.add_signal_handler(signal_number, lambda: stopped.done() or stopped.set_result(None))
