@@ -53,7 +53,7 @@ struct SmtpTransport::Session {
     static size_t read(char* buffer, size_t size, size_t count, void* self);
     static int trace(CURL*, curl_infotype type, char* data, size_t size, void* self);
 
-    CURLcode perform(const QString& sender, const QStringList& recipients, bool freshConnection);
+    CURLcode perform(const QString& sender, const QStringList& recipients);
     long lastResponse() const;
 };
 
@@ -94,7 +94,7 @@ int SmtpTransport::Session::trace(CURL*, curl_infotype type, char* data, size_t 
     return 0;
 }
 
-CURLcode SmtpTransport::Session::perform(const QString& sender, const QStringList& recipients, bool freshConnection)
+CURLcode SmtpTransport::Session::perform(const QString& sender, const QStringList& recipients)
 {
     curl_slist* envelope = nullptr;
     for (const QString& recipient : recipients)
@@ -102,7 +102,6 @@ CURLcode SmtpTransport::Session::perform(const QString& sender, const QStringLis
     curl_easy_setopt(curl, CURLOPT_MAIL_FROM, envelopeAddress(sender).constData());
     curl_easy_setopt(curl, CURLOPT_MAIL_RCPT, envelope);
     curl_easy_setopt(curl, CURLOPT_INFILESIZE_LARGE, static_cast<curl_off_t>(parts[0]->size() + parts[1]->size()));
-    curl_easy_setopt(curl, CURLOPT_FRESH_CONNECT, freshConnection ? 1L : 0L);
     part = 0;
     offset = 0;
     lastRecipient.clear();
@@ -162,11 +161,7 @@ QString SmtpTransport::send(const QString& sender, const QStringList& recipients
 {
     Session& session = *session_;
     session.parts = {&headers, &content};
-    CURLcode code = session.perform(sender, recipients, false);
-    // A kept connection that the server closed while idle gives no answer at all: the message
-    // never started, so it goes out once more on a new connection.
-    if (code != CURLE_OK && session.lastResponse() == 0 && !session.dataStarted)
-        code = session.perform(sender, recipients, true);
+    const CURLcode code = session.perform(sender, recipients);
     if (code == CURLE_OK)
         return {};
     const long response = session.lastResponse();

@@ -23,8 +23,8 @@ struct SmtpServer {
 };
 
 // The mail transport over SMTP (libcurl). One connection serves the whole run: it is opened
-// with the first message and kept; when the server has closed it between two messages, the
-// next message opens a new one, once. A server's certificate is always verified.
+// with the first message and kept; libcurl sees when the server has closed it between two
+// messages and opens a new one for the next. A server's certificate is always verified.
 class SmtpTransport : public MailTransport {
 public:
     explicit SmtpTransport(const SmtpServer& server);

@@ -2,6 +2,8 @@
 
 #include <QSet>
 
+#include <functional>
+
 using namespace Qt::StringLiterals;
 
 namespace pelmar::test {
@@ -25,6 +27,31 @@ QString mAddress(int n)
 }
 
 class EmailCampaignTest : public MailTest {};
+
+// Accepts every message and notes, as each one starts, how many recipients the journal on disk
+// holds.
+class JournalWatchingTransport : public MailTransport {
+public:
+    explicit JournalWatchingTransport(std::function<QStringList()> journal) : journal_(std::move(journal)) {}
+    QString send(const QString&, const QStringList&, const QByteArray&, const QByteArray&) override
+    {
+        seen.append(journal_().size());
+        return {};
+    }
+    QList<qsizetype> seen;
+
+private:
+    std::function<QStringList()> journal_;
+};
+
+TEST_F(EmailCampaignTest, EachAcceptedMessageIsOnDiskBeforeTheNextStarts)
+{
+    cards(u"M01"_s, u"M04"_s);
+    JournalWatchingTransport transport([this] { return journal(); });
+    RunContext run = context();
+    SendEmailCampaign(run, transport, journalFolder());
+    EXPECT_EQ(transport.seen, (QList<qsizetype>{0, 1, 2, 3}));
+}
 
 TEST_F(EmailCampaignTest, EachRecipientGetsAMessageOfItsOwnOverOneConnection)
 {
@@ -160,6 +187,18 @@ TEST_F(EmailCampaignTest, AddressesAndNamesComeFromTheContactTheCardOrTheAddress
                     {u"exclamation"_s, {}, u"Cannot resolve address 'שבע<x@a7.test>\r\nRCPT TO:<spy@evil.test>'"_s}}));
 }
 
+TEST_F(EmailCampaignTest, ARecipientThatCannotBeReachedDropsItsWholeGroup)
+{
+    cards(u"A1"_s, u"A9"_s);
+    options.emailMethod = 2;
+    options.emailGroupSize = u"7"_s;
+    SmtpSink sink;
+    EXPECT_EQ(send(sink), u"נשלחו 0 הודעות; 7 נמענים לא קיבלו את ההודעה."_s);
+    EXPECT_TRUE(sink.messages().isEmpty());
+    ASSERT_EQ(messages.boxes.size(), 1);
+    EXPECT_TRUE(messages.boxes[0].text.startsWith(u"Cannot resolve address 'שבע<x@a7.test>"_s));
+}
+
 TEST_F(EmailCampaignTest, AServerThatGoesAwayEndsTheRunAndARerunGoesOnOrStartsOver)
 {
     options.emailMethod = 2;
@@ -218,6 +257,28 @@ TEST_F(EmailCampaignTest, NoStartsTheStoppedCampaignOverAndTheStopFlagKeepsThePa
     send(again);
     EXPECT_EQ(again.messages().size(), 3) << "No sends to everyone again";
     EXPECT_TRUE(journal().isEmpty());
+}
+
+TEST_F(EmailCampaignTest, AnotherMessageOrSelectionIsAnotherCampaignThatAsksNothing)
+{
+    StopToken stopAtOnce(state.StopRequested, [&] { state.StopRequested = true; });
+    {
+        SmtpSink sink;
+        options.smtpPort = QString::number(sink.port());
+        SmtpTransport transport(smtpServerOf(options));
+        RunContext run{options, state, services(), progress, stopAtOnce, {}};
+        SendEmailCampaign(run, transport, journalFolder());
+    }
+    state.StopRequested = false;
+    const MailingOptions stopped = options;
+    for (const auto& change : {std::function<void()>([&] { options.emailSubject += u"!"_s; }),
+                               std::function<void()>([&] { options.toCard = u"M44"_s; })}) {
+        options = stopped;
+        change();
+        SmtpSink sink;
+        send(sink);
+        EXPECT_TRUE(messages.boxes.isEmpty()) << messages.boxes.value(0).text.toStdString();
+    }
 }
 
 TEST_F(EmailCampaignTest, ProgressCountsTheRecipientsAndClearsAtTheEnd)

@@ -84,6 +84,18 @@ TEST_F(EmailMessageTest, TheHtmlBodyFileIsReadAsUtf8OrWindows1255AndSentAsHtml)
     }
 }
 
+TEST_F(EmailMessageTest, AnHtmlBodyThatCannotBeReadIsReportedAndNothingIsSent)
+{
+    options.emailHtmlBody = u"/proc/self/mem"_s;  // a file whose first bytes cannot be read
+    SmtpSink sink;
+    send(sink);
+    EXPECT_TRUE(sink.messages().isEmpty());
+    ASSERT_EQ(messages.boxes.size(), 1);
+    EXPECT_EQ(messages.boxes[0].kind, u"plain"_s);
+    EXPECT_TRUE(messages.boxes[0].text.startsWith(u"Error "_s)) << messages.boxes[0].text.toStdString();
+    EXPECT_TRUE(messages.boxes[0].text.contains(u" reading file\r\n"_s)) << messages.boxes[0].text.toStdString();
+}
+
 TEST_F(EmailMessageTest, TheAttachmentGoesWithItsHebrewNameAndItsBytes)
 {
     const QByteArray bytes("PK\x03\x04 binary \x00\xFF bytes", 22);
