@@ -21,6 +21,12 @@ void say(const QString& title, const QString& text)
 
 }  // namespace
 
+bool isYesAnswer(const QString& answer)
+{
+    const QString word = answer.trimmed().toLower();
+    return word == u"y"_s || word == u"yes"_s || word == u"כ"_s || word == u"כן"_s;
+}
+
 bool ConsoleMessages::question(const QString& title, const QString& text)
 {
     if (yes_)
@@ -31,8 +37,7 @@ bool ConsoleMessages::question(const QString& title, const QString& text)
     }
     say(title, text + u" [y/N]"_s);
     QTextStream in(stdin);
-    const QString answer = in.readLine().trimmed().toLower();
-    return answer == u"y"_s || answer == u"yes"_s || answer == u"כ"_s || answer == u"כן"_s;
+    return isYesAnswer(in.readLine());
 }
 
 void ConsoleMessages::information(const QString& title, const QString& text)

@@ -9,6 +9,10 @@ namespace pelmar {
 
 // The outside systems of a run without a window, on a terminal or in a scheduled job.
 
+// True for a typed answer that says yes: "y", "yes", "כ" or "כן", in any case, blanks around
+// it allowed.
+bool isYesAnswer(const QString& answer);
+
 // Message boxes on standard error, each with its title. A question is answered Yes when the
 // caller said so beforehand (--yes); otherwise it is asked on the terminal, and answered No when
 // standard input is not one.

@@ -68,6 +68,14 @@ TEST(Console, MessagesGoToStandardErrorWithTheirTitlesAndACriticalOneFailsTheCom
     EXPECT_TRUE(messages.failed());
 }
 
+TEST(Console, OnlyAnAnswerThatSaysYesIsYes)
+{
+    for (const QString& yes : {u"y"_s, u"Y"_s, u" yes \n"_s, u"YES"_s, u"כ"_s, u"כן"_s})
+        EXPECT_TRUE(isYesAnswer(yes)) << yes.toStdString();
+    for (const QString& no : {u""_s, u"n"_s, u"no"_s, u"yess"_s, u"y y"_s, u"לא"_s})
+        EXPECT_FALSE(isYesAnswer(no)) << no.toStdString();
+}
+
 TEST(Console, TheBrowserPrintsThePathAndOpensTheFileOnlyWhenAsked)
 {
     FakeBrowser real;

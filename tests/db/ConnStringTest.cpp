@@ -73,6 +73,8 @@ TEST(ConnectionTarget, EveryKindBecomesAnOdbcStringThatQuotesWhatNeedsIt)
          "ClientCharset=UTF-8"_s},
         {BuildConnString(u"db,1433"_s, u""_s, u""_s, u"SBO"_s), u"ODBC Driver 18 for SQL Server"_s,
          u"DRIVER={ODBC Driver 18 for SQL Server};SERVER=db,1433;DATABASE=SBO;Trusted_Connection=yes"_s},
+        {BuildConnString(u"db"_s, u""_s, u"pw"_s, u".SBO"_s), u"ODBC Driver 18 for SQL Server"_s,
+         u"DRIVER={ODBC Driver 18 for SQL Server};SERVER=db;DATABASE=SBO;Trusted_Connection=yes"_s},
         {BuildConnString(u"db\\SQL2019"_s, u"sa"_s, u"pw"_s, u".SBO"_s), u"ODBC Driver 17 for SQL Server"_s,
          u"DRIVER={ODBC Driver 17 for SQL Server};SERVER=db\\SQL2019;DATABASE=SBO;UID=sa;PWD=pw"_s},
         {BuildConnString(u"MyDsn"_s, u"u=1"_s, u"pw"_s, u""_s), pg, u"DSN=MyDsn;UID={u=1};PWD=pw"_s},
