@@ -242,12 +242,9 @@ QString BuildSelect(const MailingOptions& c, short level, int pDocIndex, bool pA
     return columns + plan.extraColumns + fromClause(c, level, pDocIndex, pAllDetails, pOutType);
 }
 
-// Every caller that orders asks for the details of kinds 2 to 6 and for the plain card list of
-// kind 1, so that is the column list the keys are looked up in.
-QString BuildOrderBy(const MailingOptions& c, short level, int pDocIndex, short pOutType)
+QString BuildOrderBy(const MailingOptions& c, short level, int pDocIndex, bool pAllDetails, short pOutType)
 {
-    const bool details = pOutType != kCardList;
-    const QString columns = ownColumns(c, level, pDocIndex, details, pOutType);
+    const QString columns = ownColumns(c, level, pDocIndex, pAllDetails, pOutType);
     const QString dir = direction(c.sortDir);
     QStringList parts;
     for (const QString& key : sortPlan(c, columns, pDocIndex, pOutType).orderBy)
@@ -262,7 +259,7 @@ QString recipientStatement(const MailingOptions& options, const SessionState& st
     QString statement
         = BuildSelect(options, level, options.docType, pAllDetails, pOutType) + BuildWhere(options, state);
     if (ordered)
-        statement += BuildOrderBy(options, level, options.docType, pOutType);
+        statement += BuildOrderBy(options, level, options.docType, pAllDetails, pOutType);
     return statement;
 }
 

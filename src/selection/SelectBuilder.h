@@ -28,8 +28,9 @@ bool documentJoin(const MailingOptions& options);
 // by a column outside its list. A kind outside 1..6 gives no column list.
 QString BuildSelect(const MailingOptions& options, short level, int pDocIndex, bool pAllDetails, short pOutType);
 
-// " ORDER BY key direction[, key2 direction]" from the sort choice and the address source.
-QString BuildOrderBy(const MailingOptions& options, short level, int pDocIndex, short pOutType);
+// " ORDER BY key direction[, key2 direction]" from the sort choice and the address source. It
+// names the SortKey columns BuildSelect adds, so it must be given the same inputs.
+QString BuildOrderBy(const MailingOptions& options, short level, int pDocIndex, bool pAllDetails, short pOutType);
 
 // The whole recipient statement of an output kind: BuildSelect + BuildWhere (+ BuildOrderBy when
 // ordered), for the chosen document type at the session's schema level. Throws Failure as

@@ -1,4 +1,5 @@
 #include "common/SessionState.h"
+#include "options/Lists.h"
 #include "options/MailingOptions.h"
 #include "selection/SelectBuilder.h"
 #include "selection/WhereBuilder.h"
@@ -283,7 +284,7 @@ TEST_P(RecipientSelection, TheAddressSourceAndSchemaLevelChooseTheLabelColumns)
         }
         int checked = 0;
         auto rows = run(BuildSelect(c, a.level, 0, true, kLabels) + BuildWhere(c, SessionState{})
-                        + BuildOrderBy(c, a.level, 0, kLabels));
+                        + BuildOrderBy(c, a.level, 0, true, kLabels));
         for (; !rows->eof(); rows->moveNext(), ++checked) {
             const QVariantMap& card = cards[rows->value(u"CardCode"_s).toString()];
             ASSERT_EQ(rows->value(u"MailCity"_s).toString(), a.city(card)) << a.source;
@@ -339,6 +340,27 @@ TEST_P(RecipientSelection, ADocumentsContactIsTheLabelsContactWhereTheDocumentNa
         }
         if (table.namesContact) {
             EXPECT_GT(otherThanMain, 0) << table.name.toStdString() << ": the fixture must tell the two apart";
+        }
+    }
+}
+
+TEST_P(RecipientSelection, EveryKindWithOrWithoutDetailsRunsWithEverySortKeyAndAddressSource)
+{
+    SessionState state;
+    state.SboVersionLevel = 1;
+    for (short kind = kCardList; kind <= kLetters; ++kind) {
+        for (const bool details : {false, true}) {
+            for (int sortBy = -1; sortBy < sortByEntries().size(); ++sortBy) {
+                for (const int source : {0, 1, 2}) {
+                    MailingOptions c;
+                    c.sortBy = sortBy;
+                    c.addressFrom = source;
+                    c.dates = source == 2;
+                    c.fromDate = u"1/1/03"_s;
+                    const QString statement = recipientStatement(c, state, kind, details, true);
+                    EXPECT_NO_THROW(run(statement)) << statement.toStdString();
+                }
+            }
         }
     }
 }

@@ -42,7 +42,7 @@ TEST(StatementText, TheDocumentedExamplesComeOutByteForByte)
               "OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn )"_s);
 
     labels.sortBy = 4;
-    EXPECT_EQ(BuildOrderBy(labels, 0, 0, kLabels), u" ORDER BY OCPR.Name ASC, OCRD.MailZipCod ASC"_s);
+    EXPECT_EQ(BuildOrderBy(labels, 0, 0, true, kLabels), u" ORDER BY OCPR.Name ASC, OCRD.MailZipCod ASC"_s);
 }
 
 TEST(StatementText, EachCriterionAddsItsFragmentInOrder)
@@ -179,7 +179,7 @@ TEST(StatementText, SelectListsFollowKindSourceLevelAndJoin)
         BuildSelect(checks, -1, 6, true, kLabels),
         u"SELECT DISTINCT OCRD.CardCode, OCHO.VendorName As CardName, OCRD.Notes As MailAddres, '' MailCounty, '' MailCity, '' MailZipCod, OCPR.Name Attn, OCPR.Notes1 Department, OCPR.Address As CntctAddrs FROM (OCRD INNER JOIN OCHO ON OCRD.CardCode = OCHO.VendorCode) LEFT JOIN OCPR ON (OCPR.CardCode = OCRD.CardCode AND OCPR.Name = OCRD.CntctPrsn)"_s);
     checks.sortBy = 1;
-    EXPECT_EQ(BuildOrderBy(checks, -1, 6, kLabels), u" ORDER BY OCHO.VendorName ASC"_s)
+    EXPECT_EQ(BuildOrderBy(checks, -1, 6, true, kLabels), u" ORDER BY OCHO.VendorName ASC"_s)
         << "the name key is the column the list takes the name from";
 
     MailingOptions fax;
@@ -198,16 +198,16 @@ TEST(StatementText, ASortKeyOutsideTheListIsSelectedSoTheDatabaseAcceptsTheOrder
     c.sortBy = 2;
     c.addressFrom = 0;
     EXPECT_TRUE(BuildSelect(c, 1, 0, false, kCardList).contains(u", OCRD.MailCity AS SortKey1 FROM"_s));
-    EXPECT_EQ(BuildOrderBy(c, 1, 0, kCardList), u" ORDER BY SortKey1 ASC"_s);
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, false, kCardList), u" ORDER BY SortKey1 ASC"_s);
     EXPECT_FALSE(BuildSelect(c, 1, 0, true, kLabels).contains(u"SortKey"_s));
-    EXPECT_EQ(BuildOrderBy(c, 1, 0, kLabels), u" ORDER BY OCRD.MailCity ASC"_s);
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, true, kLabels), u" ORDER BY OCRD.MailCity ASC"_s);
 
     c.sortBy = 5;
     c.sortDir = -1;
     EXPECT_TRUE(
         BuildSelect(c, 1, 0, true, kLabels).contains(u", OCPR.Cellolar AS SortKey1, OCRD.Cellular AS SortKey2 FROM"_s));
-    EXPECT_EQ(BuildOrderBy(c, 1, 0, kLabels), u" ORDER BY SortKey1 , SortKey2 "_s);
-    EXPECT_EQ(BuildOrderBy(c, 1, 0, kMobiles), u" ORDER BY OCPR.Cellolar , OCRD.Cellular "_s);
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, true, kLabels), u" ORDER BY SortKey1 , SortKey2 "_s);
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, true, kMobiles), u" ORDER BY OCPR.Cellolar , OCRD.Cellular "_s);
 }
 
 TEST(StatementText, TheCardListNeverGainsAContactColumnAndUserExpressionsHideNoKey)
@@ -216,9 +216,9 @@ TEST(StatementText, TheCardListNeverGainsAContactColumnAndUserExpressionsHideNoK
     c.allContacts = true;
     c.sortBy = 4;
     EXPECT_TRUE(BuildSelect(c, 1, 0, false, kCardList).contains(u", OCRD.MailZipCod AS SortKey1 FROM"_s));
-    EXPECT_EQ(BuildOrderBy(c, 1, 0, kCardList), u" ORDER BY SortKey1 ASC"_s);
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, false, kCardList), u" ORDER BY SortKey1 ASC"_s);
     c.sortBy = 5;
-    EXPECT_EQ(BuildOrderBy(c, 1, 0, kCardList), u" ORDER BY SortKey1 ASC"_s);
+    EXPECT_EQ(BuildOrderBy(c, 1, 0, false, kCardList), u" ORDER BY SortKey1 ASC"_s);
     EXPECT_FALSE(BuildSelect(c, 1, 0, false, kCardList).contains(u"OCPR.Cellolar"_s)) << "one row per card";
 
     MailingOptions merged;
