@@ -105,17 +105,21 @@ private:
 
 }  // namespace
 
+std::pair<int, int> readLabelPage(const MailingOptions& options)
+{
+    const int cols = wholeNumberIn(options.cols, u"עמודות"_s, 1, kMaxShort);
+    const int rows = wholeNumberIn(options.rows, u"שורות"_s, 1, kMaxShort);
+    if (rows * cols > kMaxShort)
+        throw Failure(
+            u"דף של %1 שורות ו-%2 עמודות גדול מדי: מותרות עד %3 מדבקות בדף."_s.arg(rows).arg(cols).arg(kMaxShort), 6);
+    return {rows, cols};
+}
+
 LabelLayout LabelLayout::read(const MailingOptions& options)
 {
     LabelLayout layout{};
-    layout.cols = wholeNumberIn(options.cols, u"עמודות"_s, 1, kMaxShort);
-    layout.rows = wholeNumberIn(options.rows, u"שורות"_s, 1, kMaxShort);
+    std::tie(layout.rows, layout.cols) = readLabelPage(options);
     layout.start = wholeNumberIn(options.startFrom, u"התחל ממדבקה"_s, -kMaxShort - 1, kMaxShort);
-    if (layout.rows * layout.cols > kMaxShort)
-        throw Failure(u"דף של %1 שורות ו-%2 עמודות גדול מדי: מותרות עד %3 מדבקות בדף."_s.arg(layout.rows)
-                          .arg(layout.cols)
-                          .arg(kMaxShort),
-                      6);
     layout.copies = wholeNumberIn(options.copies, u"עותקים"_s, 0, 255);
     return layout;
 }

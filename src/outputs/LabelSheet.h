@@ -5,6 +5,7 @@
 #include <QString>
 
 #include <functional>
+#include <utility>
 
 namespace pelmar {
 
@@ -23,6 +24,11 @@ struct LabelLayout {
     static LabelLayout read(const MailingOptions& options);
     int perPage() const { return rows * cols; }
 };
+
+// The rows and columns of a label page as the layout boxes give them; throws Failure naming the
+// box that holds no number in range, or saying that the page would hold more than 32767 labels.
+// The label sheet and the labels list read the page the same way.
+std::pair<int, int> readLabelPage(const MailingOptions& options);
 
 // The two statements of a label run and where they are read.
 struct LabelQueries {

@@ -5,6 +5,7 @@
 #include "common/SessionState.h"
 #include "log/RunLog.h"
 #include "options/MailingOptions.h"
+#include "outputs/LabelSheet.h"
 #include "outputs/Output.h"
 #include "outputs/RecipientList.h"
 #include "outputs/RunParameters.h"
@@ -34,8 +35,7 @@ void CreateHTML(const QString& pFileName, short pOutType, RunContext& context)
     const QString connString = openCompany(context);
     std::optional<ListPageLayout> pages;
     if (pOutType == kLabels) {
-        const int cols = wholeNumberIn(context.options.cols, u"עמודות"_s, 1, 32767);
-        const int rows = wholeNumberIn(context.options.rows, u"שורות"_s, 1, 32767);
+        const auto [rows, cols] = readLabelPage(context.options);
         pages = ListPageLayout{rows, cols, wholeNumberIn(context.options.copies, u"עותקים"_s, 0, 255)};
     }
     const ListQuery query = listQuery(connString, pOutType, context);

@@ -1,5 +1,6 @@
 #include "common/Failure.h"
 #include "common/Windows1255.h"
+#include "outputs/LabelSheet.h"
 #include "outputs/RecipientList.h"
 #include "outputs/Runs.h"
 #include "support/FailureOf.h"
@@ -83,6 +84,18 @@ TEST_F(RecipientListTest, TheLabelsListIsWrittenByteForByte)
     EXPECT_EQ(list(2), expected);
 }
 
+TEST_F(RecipientListTest, TheLabelsListRefusesThePageTheLabelSheetRefuses)
+{
+    options.rows = u"200"_s;
+    options.cols = u"200"_s;
+    const QString refusal = u"דף של 200 שורות ו-200 עמודות גדול מדי: מותרות עד 32767 מדבקות בדף."_s;
+    EXPECT_EQ(failureOf([&] { list(2); }), refusal);
+    EXPECT_EQ(failureOf([&] { LabelLayout::read(options); }), refusal);
+    options.rows = u"181"_s;
+    options.cols = u"181"_s;
+    EXPECT_TRUE(list(2).contains(u"מספר הדפים הנדרשים: 1</p>"_s)) << "181 x 181 = 32761 labels fit a page";
+}
+
 TEST_F(RecipientListTest, EachKindShowsItsOwnColumnsWithContactValuesBeforeCardValues)
 {
     EXPECT_EQ(
@@ -135,6 +148,7 @@ TEST_F(RecipientListTest, ThePreviewWritesTheListOfTheChosenOutputAndLogsIt)
         options = kept;
     }
     EXPECT_EQ(browser.opened.size(), 1) << "a list that cannot be written opens no window";
+    options.rows = u"1"_s;
     options.cols = u"32767"_s;
     options.copies = u"255"_s;
     run(u"list"_s);
