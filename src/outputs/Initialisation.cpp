@@ -26,6 +26,10 @@ void initialiseSession(SettingsStore& store, const DatabaseClient& client, Sessi
 {
     ignoringFailure([&] { LoadConnSettings(store, state); });
     ignoringFailure([&] { InitLog(); });
+    // The employees are the company's: a company that cannot be reached has none, and a stored
+    // choice counts only when the refilled list can show it.
+    options.agents.clear();
+    options.agentIndex = -1;
     ignoringFailure([&] {
         if (state.ConnDataBase != QString::fromUtf16(kUnconfiguredDatabase)
             && TestConnection(client, state, state.ConnDataBase))

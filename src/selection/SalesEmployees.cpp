@@ -23,7 +23,7 @@ void FillCmbAgent(const DatabaseClient& client, const QString& connString, Maili
                 employees.append({name, rows->value(u"SlpCode"_s).toInt()});
         }
         options.agents = employees;
-        options.agentIndex = employees.isEmpty() ? -1 : 0;
+        options.agentIndex = -1;
     } catch (const Failure&) {}
 }
 

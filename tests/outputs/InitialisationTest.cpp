@@ -1,6 +1,8 @@
 #include "log/RunLog.h"
 #include "outputs/Initialisation.h"
+#include "selection/SelectBuilder.h"
 #include "support/Engines.h"
+#include "support/FailureOf.h"
 #include "support/OutputRun.h"
 #include "support/PgCluster.h"
 
@@ -39,7 +41,15 @@ TEST_F(Initialisation, AConfiguredCompanyFillsTheSalesEmployeesBeforeTheStoredCh
     EXPECT_EQ(options.agentIndex, 5);
     store->setValue(u"Pelmar"_s, u"Params"_s, u"Agent"_s, u"6"_s);
     initialise();
-    EXPECT_EQ(options.agentIndex, 0) << "one past the list: the refilled list's first entry stays";
+    EXPECT_EQ(options.agentIndex, -1) << "one past the refilled list: no employee is chosen";
+    options.agent = true;
+    EXPECT_EQ(failureOf([&] { recipientStatement(options, state, 2, true, true); }),
+              u"נבחר סינון לפי סוכן, אך לא נבחר סוכן מהרשימה. יש לבחור סוכן או לבטל את הסינון."_s);
+
+    pointAt(engine->server(), u"NoSuchCompany"_s);
+    initialise();
+    EXPECT_TRUE(options.agents.isEmpty()) << "the employees of a company that cannot be opened are none";
+    EXPECT_EQ(options.agentIndex, -1);
 }
 
 TEST_F(Initialisation, TheUnconfiguredDatabaseIsNeverTried)
