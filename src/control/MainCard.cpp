@@ -67,6 +67,7 @@ void MainCard::connectHandlers()
     for (int i = 1; i <= 3; ++i)
         connect(c_.CmdDir[i], &QToolButton::clicked, this, [this, i] { CmdDir_Click(i); });
     c_.cmbCS->installEventFilter(this);
+    connect(c_.cmbCS, &QComboBox::activated, this, &MainCard::cmbCS_Validate);
     connect(c_.cmdSelectAccount, &QPushButton::clicked, this, &MainCard::cmdSelectAccount_Click);
     connect(c_.CmdSelectGroup, &QPushButton::clicked, this, &MainCard::CmdSelectGroup_Click);
     connect(c_.cmdQryGroup, &QPushButton::clicked, this, &MainCard::cmdQryGroup_Click);
@@ -87,10 +88,13 @@ void MainCard::showOptions()
 
 bool MainCard::eventFilter(QObject* watched, QEvent* event)
 {
-    // The card type's groups belong to one type: leaving the list forgets the chosen groups.
-    if (watched == c_.cmbCS && event->type() == QEvent::FocusOut
-        && static_cast<QFocusEvent*>(event)->reason() != Qt::PopupFocusReason)
-        cmbCS_Validate();
+    // The card type's groups belong to one type: moving on from the list to another control
+    // forgets the chosen groups. Opening its popup or switching to another window is not moving on.
+    if (watched == c_.cmbCS && event->type() == QEvent::FocusOut) {
+        const Qt::FocusReason reason = static_cast<QFocusEvent*>(event)->reason();
+        if (reason != Qt::PopupFocusReason && reason != Qt::ActiveWindowFocusReason)
+            cmbCS_Validate();
+    }
     return QWidget::eventFilter(watched, event);
 }
 

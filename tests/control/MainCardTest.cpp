@@ -106,9 +106,16 @@ TEST_F(MainCardTest, LeavingTheCardTypeListForgetsTheChosenGroups)
     QFocusEvent popup(QEvent::FocusOut, Qt::PopupFocusReason);
     QCoreApplication::sendEvent(c().cmbCS, &popup);
     EXPECT_EQ(state.SelCardGroups.size(), 3) << "opening the list's popup is not leaving it";
+    QFocusEvent away(QEvent::FocusOut, Qt::ActiveWindowFocusReason);
+    QCoreApplication::sendEvent(c().cmbCS, &away);
+    EXPECT_EQ(state.SelCardGroups.size(), 3) << "switching to another window is not leaving the list";
     QFocusEvent leave(QEvent::FocusOut, Qt::TabFocusReason);
     QCoreApplication::sendEvent(c().cmbCS, &leave);
     EXPECT_EQ(state.SelCardGroups.size(), 1);
+
+    state.SelCardGroups = {CardGroupSel{}, CardGroupSel{100, true}};
+    c().cmbCS->activated(1);
+    EXPECT_EQ(state.SelCardGroups.size(), 1) << "choosing another card type forgets the groups";
 }
 
 TEST_F(MainCardTest, FilePickersUseTheirFiltersAndACancelLeavesTheBoxUnchanged)

@@ -50,11 +50,13 @@ CardGroupDialog::CardGroupDialog(Services services, SessionState& state, const Q
     QVector<CheckListModel::Row> groups;
     try {
         readCardGroups(services_.database, connString, state_.GroupCardType, groups);
+        // The stored choice follows the groups of the type, as many as were read.
+        model.setRows(groups);
+        state_.SelCardGroups.resize(model.rowCount() + 1);
     } catch (const Failure& failure) {
+        // Groups that cannot be read say nothing of the stored choice: it stays as it was.
         services_.messages.plain(failure.description());
     }
-    model.setRows(groups);
-    state_.SelCardGroups.resize(model.rowCount() + 1);
     UpdateGridByArray();
 }
 

@@ -105,6 +105,24 @@ TEST_F(PickersTest, AChoiceComesBackOnReopeningAndCancelKeepsTheStoredOne)
     EXPECT_EQ(state.SelCardGroups.size(), 5) << "the selection is cut to the rows of the list";
 }
 
+TEST_F(PickersTest, GroupsThatCannotBeReadLeaveTheStoredChoiceAsItWas)
+{
+    state.GroupCardType = 0;
+    state.SelCardGroups = {CardGroupSel{}, {100, true}, {103, true}};
+    for (const bool ok : {false, true}) {
+        CardGroupDialog dialog(services(), state, engine->connString(u"missing"_s));
+        EXPECT_EQ(dialog.model.rowCount(), 0);
+        ok ? dialog.cmdOK_Click() : dialog.reject();
+        EXPECT_EQ(state.SelCardGroups.size(), 3) << ok;
+    }
+    ASSERT_EQ(messages.boxes.size(), 2);
+    EXPECT_EQ(messages.boxes[0].kind, u"plain"_s);
+    MailingOptions customers;
+    customers.catCode = true;
+    EXPECT_EQ(BuildWhere(customers, state),
+              u" Where (1 > 0) AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s);
+}
+
 TEST_F(PickersTest, TheGroupButtonNeedsACardTypeAndTicksTheCriterion)
 {
     c().cmbCS->setCurrentIndex(-1);
