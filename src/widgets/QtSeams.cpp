@@ -52,8 +52,17 @@ QStringList qtFilters(const QString& classicFilter)
 {
     const QStringList parts = classicFilter.split(u'|');
     QStringList filters;
-    for (qsizetype i = 0; i + 1 < parts.size(); i += 2)
-        filters << parts.at(i) + u" ("_s + QString(parts.at(i + 1)).replace(u';', u' ') + u')';
+    for (qsizetype i = 0; i + 1 < parts.size(); i += 2) {
+        // A classic label shows its patterns itself; the Qt dialog adds them again.
+        QString label = parts.at(i);
+        const qsizetype shown = label.lastIndexOf(u" ("_s);
+        if (shown > 0 && label.endsWith(u')'))
+            label.truncate(shown);
+        // "*.*" means every file there, but on Linux it would hide the files without a suffix.
+        QStringList patterns = parts.at(i + 1).split(u';', Qt::SkipEmptyParts);
+        patterns.replaceInStrings(u"*.*"_s, u"*"_s);
+        filters << label + u" ("_s + patterns.join(u' ') + u')';
+    }
     return filters;
 }
 
@@ -69,13 +78,20 @@ QString QtFileDialogs::saveFile(const QString& filter, int filterIndex, const QS
 {
     const QStringList filters = qtFilters(filter);
     QString selected = filters.value(filterIndex - 1, filters.value(0));
-    // The dialog itself asks before replacing a file; creating one is asked here.
-    const QString path = QFileDialog::getSaveFileName(parent_, {}, defaultName, filters.join(u";;"_s), &selected);
-    if (path.isEmpty() || QFileInfo::exists(path))
-        return path;
-    const auto answer = QMessageBox::question(parent_, QApplication::applicationName(),
-                                              u"הקובץ %1 אינו קיים. ליצור אותו?"_s.arg(path));
-    return answer == QMessageBox::Yes ? path : QString();
+    QString start = defaultName;
+    // The dialog itself asks before replacing a file; creating one is asked here, and No goes
+    // back to the dialog, as a dialog that asks before creating does.
+    for (;;) {
+        const QString path = QFileDialog::getSaveFileName(parent_, {}, start, filters.join(u";;"_s), &selected);
+        if (path.isEmpty() || QFileInfo::exists(path))
+            return path;
+        const QString title = parent_ ? parent_->window()->windowTitle() : QString();
+        if (show(parent_, QMessageBox::Question, title, u"הקובץ %1 אינו קיים. ליצור אותו?"_s.arg(path),
+                 QMessageBox::Yes | QMessageBox::No)
+            == QMessageBox::Yes)
+            return path;
+        start = path;
+    }
 }
 
 }  // namespace pelmar

@@ -32,8 +32,8 @@ private:
     QWidget* parent_;
 };
 
-// "All Files (*.*)|*.*|Word Files (*.doc)|*.doc" as the Qt dialogs write filters:
-// "All Files (*.*) (*.*);;Word Files (*.doc) (*.doc)".
+// "All Files (*.*)|*.*|Word Files (*.doc)|*.doc" as the Qt dialogs write filters, each label
+// once and "*.*" as every file: "All Files (*)", "Word Files (*.doc)".
 QStringList qtFilters(const QString& classicFilter);
 
 }  // namespace pelmar
