@@ -2,12 +2,12 @@
 #include "common/SessionState.h"
 #include "control/MainCard.h"
 #include "control/RealServices.h"
+#include "widgets/QtTranslation.h"
 
 #include <QApplication>
+#include <QCloseEvent>
 #include <QDir>
 #include <QFile>
-#include <QLibraryInfo>
-#include <QLocale>
 #include <QMainWindow>
 #include <QTranslator>
 
@@ -36,14 +36,18 @@ void ensureRuntimeFolder()
     qputenv("XDG_RUNTIME_DIR", folder.toLocal8Bit());
 }
 
-// Qt's own texts (the buttons of the message boxes, the file dialogs) in Hebrew, from Qt's
-// translations (Debian's qt6-translations-l10n); without them they stay in English.
-void translateQt(QTranslator& translator)
-{
-    if (translator.load(QLocale(QLocale::Hebrew), u"qtbase"_s, u"_"_s,
-                        QLibraryInfo::path(QLibraryInfo::TranslationsPath)))
-        QCoreApplication::installTranslator(&translator);
-}
+// The host window: it asks the mailing control before it closes.
+class HostWindow : public QMainWindow {
+public:
+    pelmar::MainCard* card = nullptr;
+
+protected:
+    void closeEvent(QCloseEvent* event) override
+    {
+        if (card && !card->mayClose())
+            event->ignore();
+    }
+};
 
 // The window: the mailing control on a host window titled "Pelmar".
 int runWindow(int argc, char* argv[])
@@ -51,13 +55,14 @@ int runWindow(int argc, char* argv[])
     QApplication app(argc, argv);
     nameTheApplication();
     QTranslator translator;
-    translateQt(translator);
+    pelmar::installQtHebrew(translator);
     QApplication::setLayoutDirection(Qt::RightToLeft);
     pelmar::RealServices real;
     pelmar::SessionState state;
-    QMainWindow window;
+    HostWindow window;
     window.setWindowTitle(u"Pelmar"_s);
     auto* card = new pelmar::MainCard(real.services(), state, &window);
+    window.card = card;
     window.setCentralWidget(card);
     card->UserControl_Initialize();
     window.resize(1024, 720);

@@ -19,6 +19,7 @@
 #include <QFrame>
 #include <QLabel>
 #include <QLineEdit>
+#include <QMessageBox>
 #include <QPushButton>
 #include <QTabWidget>
 #include <QToolButton>
@@ -101,6 +102,22 @@ bool MainCard::eventFilter(QObject* watched, QEvent* event)
 void MainCard::cmbCS_Validate()
 {
     state_.clearCardGroups();
+}
+
+bool MainCard::mayClose()
+{
+    MailingOptions stored = options_;
+    SetGetRegParams(2, services_.settings, stored);
+    if (stored == options_)
+        return true;
+    QMessageBox box(QMessageBox::Question, window()->windowTitle(), u"ההגדרות שבדפים שונו ולא נשמרו. לשמור אותן?"_s,
+                    QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel, this);
+    box.setLayoutDirection(Qt::RightToLeft);
+    switch (box.exec()) {
+    case QMessageBox::Yes: CmdDef_Click(); return true;
+    case QMessageBox::No: return true;
+    default: return false;
+    }
 }
 
 void MainCard::CmdDef_Click()

@@ -40,6 +40,10 @@ public:
     void CmdLabPrev_Click();
     void CmdPreview_Click();
     void CmdDef_Click();
+    // Asked before the window closes: when the pages hold options that differ from the stored
+    // ones, whether to save them (Yes saves as "שמור הגדרות" does, No closes without saving,
+    // Cancel keeps the window open). True when the window may close.
+    bool mayClose();
     void cmdStop_Click();
     void CmdLabDef_Click();
     void CmdConnect_Click();

@@ -1,21 +1,28 @@
 #include "common/SessionState.h"
 #include "options/OptionBindings.h"
 #include "selection/WhereBuilder.h"
+#include "support/ui/ModalCloser.h"
 #include "support/ui/WindowFixture.h"
 #include "widgets/ClickableLabel.h"
+#include "widgets/QtTranslation.h"
 #include "widgets/Tag.h"
 
+#include <QAbstractButton>
 #include <QCheckBox>
 #include <QComboBox>
 #include <QCoreApplication>
+#include <QDialogButtonBox>
 #include <QFocusEvent>
 #include <QFrame>
 #include <QLabel>
 #include <QLineEdit>
+#include <QMessageBox>
 #include <QMouseEvent>
 #include <QPlainTextEdit>
+#include <QPushButton>
 #include <QRadioButton>
 #include <QTabWidget>
+#include <QTranslator>
 
 using namespace Qt::StringLiterals;
 
@@ -143,6 +150,42 @@ TEST_F(MainCardTest, SavingStoresWhatThePagesHoldAndShowsNothing)
     card->CmdDef_Click();
     EXPECT_EQ(store->value(u"Pelmar"_s, u"Params"_s, u"Rows"_s, {}), u"12"_s);
     EXPECT_TRUE(messages.boxes.isEmpty());
+}
+
+TEST_F(MainCardTest, ClosingWithUnsavedOptionsAsksToSaveThemAndCancelStays)
+{
+    QStringList asked;
+    QMessageBox::StandardButton answer = QMessageBox::Cancel;
+    const ModalCloser closer([&](QDialog& dialog) {
+        auto* box = qobject_cast<QMessageBox*>(&dialog);
+        ASSERT_NE(box, nullptr);
+        asked << box->text();
+        box->button(answer)->click();
+    });
+    EXPECT_TRUE(card->mayClose());
+    EXPECT_TRUE(asked.isEmpty()) << "nothing changed, nothing to ask";
+    control<QLineEdit>(u"txtRows"_s)->setText(u"12"_s);
+    EXPECT_FALSE(card->mayClose());
+    EXPECT_EQ(asked, QStringList{u"ההגדרות שבדפים שונו ולא נשמרו. לשמור אותן?"_s});
+    answer = QMessageBox::No;
+    EXPECT_TRUE(card->mayClose());
+    EXPECT_EQ(store->value(u"Pelmar"_s, u"Params"_s, u"Rows"_s, u"<none>"_s), u"<none>"_s);
+    answer = QMessageBox::Yes;
+    EXPECT_TRUE(card->mayClose());
+    EXPECT_EQ(store->value(u"Pelmar"_s, u"Params"_s, u"Rows"_s, {}), u"12"_s);
+    EXPECT_EQ(asked.size(), 3);
+    EXPECT_TRUE(card->mayClose()) << "saved: nothing to ask";
+    EXPECT_EQ(asked.size(), 3);
+}
+
+TEST_F(MainCardTest, QtsOwnButtonsSpeakHebrew)
+{
+    QTranslator hebrew;
+    ASSERT_TRUE(installQtHebrew(hebrew)) << "Qt's Hebrew translations are not installed";
+    QDialogButtonBox buttons(QDialogButtonBox::Yes | QDialogButtonBox::No | QDialogButtonBox::Cancel);
+    EXPECT_EQ(buttons.button(QDialogButtonBox::Yes)->text().remove(u'&'), u"כן"_s);
+    EXPECT_EQ(buttons.button(QDialogButtonBox::No)->text().remove(u'&'), u"לא"_s);
+    QCoreApplication::removeTranslator(&hebrew);
 }
 
 TEST_F(MainCardTest, TheProgressDisplayShowsTheTextAndTheShareOfTheFrame)

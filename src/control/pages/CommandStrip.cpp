@@ -42,6 +42,8 @@ QWidget* buildCommandStrip(MainCardControls& c)
     c.CmdLabPrev = button(u"CmdLabPrev"_s, u"הפעל דיוור"_s);
     c.CmdPreview = button(u"CmdPreview"_s, u"הצג רשימת מעקב"_s);
     c.CmdDef = button(u"CmdDef"_s, u"שמור הגדרות"_s);
+    c.CmdDef->setToolTip(u"שומר את הגדרות הדפים לפעם הבאה. אינם נשמרים: תוכן ההודעה, התחלה ממדבקה, מספרי "
+                         "המסמכים, הפריטים, המאפיינים והכרטיסים שנבחרו."_s);
     c.cmdStop = button(u"cmdStop"_s, u"עצור"_s);
     c.Message1 = caption({}, u"Message1"_s);
 
