@@ -98,7 +98,8 @@ TEST_F(EmailMessageTest, AnHtmlBodyThatCannotBeReadIsReportedAndNothingIsSent)
 
 TEST_F(EmailMessageTest, TheAttachmentGoesWithItsHebrewNameAndItsBytes)
 {
-    const QByteArray bytes("PK\x03\x04 binary \x00\xFF bytes", 22);
+    static const char raw[] = "PK\x03\x04 binary \x00\xFF bytes";
+    const QByteArray bytes(raw, sizeof raw - 1);
     options.emailAttachFile = fileWith(u"nover.doc"_s, bytes);
     options.emailAttachFileDesc = u"פרטי המבצע"_s;
     SmtpSink sink;
