@@ -29,7 +29,7 @@ QVariant CheckListModel::data(const QModelIndex& index, int role) const
     if (role == Qt::DisplayRole)
         return row.texts.value(column);
     if (role == Qt::TextAlignmentRole)
-        return QVariant::fromValue(Qt::AlignRight | Qt::AlignVCenter);
+        return QVariant::fromValue(Qt::AlignLeading | Qt::AlignVCenter);
     return {};
 }
 

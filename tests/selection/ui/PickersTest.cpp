@@ -12,10 +12,12 @@
 
 #include <QCheckBox>
 #include <QComboBox>
+#include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QStyle>
 #include <QTableView>
 
 using namespace Qt::StringLiterals;
@@ -121,6 +123,22 @@ TEST_F(PickersTest, GroupsThatCannotBeReadLeaveTheStoredChoiceAsItWas)
     customers.catCode = true;
     EXPECT_EQ(BuildWhere(customers, state),
               u" Where (1 > 0) AND OCRD.CardType = 'C' AND (GroupCode=100 OR GroupCode=103)"_s);
+}
+
+TEST_F(PickersTest, TextsAndHeadersStandAtTheRightOfARightToLeftGrid)
+{
+    state.GroupCardType = 0;
+    CardGroupDialog groups(services(), state, conn());
+    QryGroupDialog properties(services(), state, conn());
+    for (QTableView* grid : {groups.CardGroups, properties.QryGroups}) {
+        ASSERT_EQ(grid->layoutDirection(), Qt::RightToLeft);
+        const auto shown = [&](QVariant alignment) {
+            return QStyle::visualAlignment(grid->layoutDirection(), alignment.value<Qt::Alignment>())
+                & (Qt::AlignLeft | Qt::AlignRight);
+        };
+        EXPECT_EQ(shown(grid->model()->index(0, 0).data(Qt::TextAlignmentRole)), Qt::AlignRight);
+        EXPECT_EQ(shown(QVariant::fromValue(grid->horizontalHeader()->defaultAlignment())), Qt::AlignRight);
+    }
 }
 
 TEST_F(PickersTest, TheGroupButtonNeedsACardTypeAndTicksTheCriterion)
