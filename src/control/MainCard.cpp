@@ -133,7 +133,7 @@ void MainCard::CmdConnect_Click()
 
 void MainCard::CmdLabDef_Click()
 {
-    LabelStyleDialog dialog(services_.settings, state_.LabelDefs, this);
+    LabelStyleDialog dialog(services_.settings, services_.messages, state_.LabelDefs, this);
     dialog.exec();
 }
 

@@ -1,6 +1,7 @@
 #include "outputs/ui/LabelStyleDialog.h"
 
 #include "common/Failure.h"
+#include "common/Messages.h"
 #include "widgets/Widgets.h"
 
 #include <QCheckBox>
@@ -35,8 +36,8 @@ bool hasFixedText(int line)
 
 }  // namespace
 
-LabelStyleDialog::LabelStyleDialog(SettingsStore& store, LabelDefTable& defs, QWidget* parent)
-    : QDialog(parent), store_(store), defs_(defs)
+LabelStyleDialog::LabelStyleDialog(SettingsStore& store, Messages& messages, LabelDefTable& defs, QWidget* parent)
+    : QDialog(parent), store_(store), messages_(messages), defs_(defs)
 {
     setObjectName(u"frmLabDef"_s);
     setWindowTitle(u"הגדרות צורה וגודל"_s);
@@ -132,11 +133,18 @@ void LabelStyleDialog::GetSetFormLabDefs(unsigned char action)
 
 void LabelStyleDialog::cmdOK_Click()
 {
-    try {
-        GetSetFormLabDefs(2);
-    } catch (const Failure&) {
-        // A size that is not a number 0..255 stops the reading; what was read is still saved.
+    for (const StyleRow& style : kRows) {
+        QLineEdit* size = txtFontSize[style.line];
+        if (!byteValue(size->text())) {
+            messages_.critical(u"שגיאה"_s,
+                               u"הגודל \"%1\" בשורה \"%2\" אינו מספר שלם בין 0 ל-255. יש לתקן אותו."_s.arg(
+                                   size->text(), QString::fromUtf16(style.caption)));
+            size->setFocus();
+            size->selectAll();
+            return;
+        }
     }
+    GetSetFormLabDefs(2);
     SetGetLabelDefs(1, store_, defs_);
     accept();
 }

@@ -1,5 +1,6 @@
 #include "outputs/LabelStyles.h"
 #include "outputs/ui/LabelStyleDialog.h"
+#include "support/Fakes.h"
 #include "support/LabelStyleStore.h"
 
 #include <QCheckBox>
@@ -12,34 +13,50 @@ using namespace Qt::StringLiterals;
 namespace pelmar::test {
 namespace {
 
-using LabelStyles = LabelStyleStore;
+class LabelStyles : public LabelStyleStore {
+protected:
+    FakeMessages messages;
+};
 
-TEST_F(LabelStyles, TheDialogShowsTheRowsAndOkSavesWhatWasReadUpToABadSize)
+TEST_F(LabelStyles, ABadSizeIsNamedAndTheDialogKeepsWhatWasTyped)
 {
-    LabelStyleDialog dialog(store, defs);
+    LabelStyleDialog dialog(store, messages, defs);
     EXPECT_EQ(dialog.txtFontSize[5]->text(), u"9"_s);
     EXPECT_EQ(dialog.txtFixed[0], nullptr);
     ASSERT_NE(dialog.txtFixed[11], nullptr);
     EXPECT_NE(dialog.findChild<QLabel*>(), nullptr);
 
+    dialog.open();
     dialog.CmbFont[0]->setCurrentIndex(1);
     dialog.txtFixed[11]->setText(u"שלום"_s);
-    dialog.CmbFont[4]->setCurrentIndex(2);
     dialog.txtFontSize[4]->setText(u"big"_s);
-    dialog.ChkUL[4]->setChecked(true);
     dialog.ChkItalic[5]->setChecked(true);
     dialog.cmdOK_Click();
+    ASSERT_EQ(messages.boxes.size(), 1);
+    EXPECT_EQ(messages.boxes[0].title, u"שגיאה"_s);
+    EXPECT_EQ(messages.boxes[0].text, u"הגודל \"big\" בשורה \"כתובת\" אינו מספר שלם בין 0 ל-255. יש לתקן אותו."_s);
+    EXPECT_TRUE(dialog.isVisible()) << "the dialog stays open";
+    EXPECT_EQ(dialog.txtFixed[11]->text(), u"שלום"_s) << "with what was typed";
+    EXPECT_EQ(defs[0].Font, 0) << "and nothing is taken yet";
+    EXPECT_EQ(key(0, u"Font"_s), u"<none>"_s);
+
+    dialog.txtFontSize[4]->setText(u"256"_s);
+    dialog.cmdOK_Click();
+    EXPECT_EQ(messages.boxes.size(), 2) << "256 is one past the largest size";
+    dialog.txtFontSize[4]->setText(u"255"_s);
+    dialog.cmdOK_Click();
+    EXPECT_EQ(messages.boxes.size(), 2);
+    EXPECT_FALSE(dialog.isVisible());
     EXPECT_EQ(defs[0].Font, 1);
-    EXPECT_TRUE(defs[11].FixedText.isEmpty()) << "lines are read 0 to 12, so line 11 comes after the bad line 4";
-    EXPECT_EQ(defs[4].Font, 2) << "the bad size's own font is taken";
-    EXPECT_EQ(defs[4].FontUL, 0) << "the fields after the bad size keep their values";
-    EXPECT_EQ(defs[5].FontItalic, 0) << "and so do the later lines";
-    EXPECT_EQ(key(4, u"Font"_s), u"2"_s) << "OK still saves";
+    EXPECT_EQ(defs[4].FontSize, 255);
+    EXPECT_EQ(defs[11].FixedText, u"שלום"_s);
+    EXPECT_EQ(defs[5].FontItalic, 1);
+    EXPECT_EQ(key(11, u"FixedText"_s), u"שלום"_s);
 }
 
 TEST_F(LabelStyles, CancelStoresNothing)
 {
-    LabelStyleDialog dialog(store, defs);
+    LabelStyleDialog dialog(store, messages, defs);
     dialog.txtFontSize[1]->setText(u"30"_s);
     dialog.cmdCancel_Click();
     EXPECT_EQ(defs[1].FontSize, 9);
