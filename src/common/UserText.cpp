@@ -16,4 +16,9 @@ QString decodeUserText(const QByteArray& bytes)
     return utf8.hasError() ? fromWindows1255(bytes) : text;
 }
 
+QString isolated(const QString& text)
+{
+    return QChar(0x2068) + text + QChar(0x2069);
+}
+
 }  // namespace pelmar

@@ -9,4 +9,9 @@ namespace pelmar {
 // mark or is valid UTF-8, otherwise windows-1255. A byte-order mark is not part of the text.
 QString decodeUserText(const QByteArray& bytes);
 
+// A value from the database or a file as a right-to-left widget should show it: between Unicode
+// first-strong isolates, so that it reads in its own direction ("O'Brien & Sons <Ltd>" and
+// "+972-4-..." keep their punctuation where it stands). For display only; files keep their bytes.
+QString isolated(const QString& text);
+
 }  // namespace pelmar

@@ -2,6 +2,7 @@
 
 #include "common/FileDialogs.h"
 #include "common/SessionState.h"
+#include "common/UserText.h"
 #include "control/OptionsBinder.h"
 #include "control/pages/Pages.h"
 #include "db/ui/LogonDialog.h"
@@ -82,7 +83,7 @@ void MainCard::showOptions()
         const QSignalBlocker quiet(c_.CmbAgent);
         c_.CmbAgent->clear();
         for (const SalesEmployee& employee : options_.agents)
-            c_.CmbAgent->addItem(employee.name, employee.code);
+            c_.CmbAgent->addItem(isolated(employee.name), employee.code);
     }
     binder_->show();
 }

@@ -1,5 +1,7 @@
 #include "selection/CheckListModel.h"
 
+#include "common/UserText.h"
+
 #include <algorithm>
 
 namespace pelmar {
@@ -27,7 +29,7 @@ QVariant CheckListModel::data(const QModelIndex& index, int role) const
     if (column == kCheckColumn)
         return role == Qt::CheckStateRole ? QVariant(row.checked ? Qt::Checked : Qt::Unchecked) : QVariant();
     if (role == Qt::DisplayRole)
-        return row.texts.value(column);
+        return isolated(row.texts.value(column));
     if (role == Qt::TextAlignmentRole)
         return QVariant::fromValue(Qt::AlignLeading | Qt::AlignVCenter);
     return {};

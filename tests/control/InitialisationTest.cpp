@@ -25,8 +25,12 @@ protected:
     QStringList agents() const
     {
         QStringList names;
-        for (int i = 0; i < c().CmbAgent->count(); ++i)
-            names << c().CmbAgent->itemText(i) + u'=' + c().CmbAgent->itemData(i).toString();
+        for (int i = 0; i < c().CmbAgent->count(); ++i) {
+            const QString shown = c().CmbAgent->itemText(i);
+            EXPECT_TRUE(shown.startsWith(QChar(0x2068)) && shown.endsWith(QChar(0x2069)))
+                << "each name shows in its own direction";
+            names << shown.mid(1, shown.size() - 2) + u'=' + c().CmbAgent->itemData(i).toString();
+        }
         return names;
     }
 

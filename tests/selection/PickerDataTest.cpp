@@ -148,6 +148,15 @@ TEST(CheckListModel, ChecksAreSetInvertedAndSearchedAsTheGridShowsThem)
     EXPECT_EQ(changed[0], std::make_pair(model.index(1, 0), model.index(1, 0)));
     EXPECT_EQ(changed[2], std::make_pair(model.index(0, 0), model.index(3, 2))) << "every row and column is shown anew";
 
+    model.setRows({{u"1"_s, {u"O'Brien & Sons <Ltd>"_s, u"+972-4-8123456"_s}}});
+    EXPECT_EQ(model.data(model.index(0, 1), Qt::DisplayRole).toString(), u"\u2068O'Brien & Sons <Ltd>\u2069"_s)
+        << "a value shows in its own direction, isolated from the grid's";
+    EXPECT_EQ(model.row(0).texts.front(), u"O'Brien & Sons <Ltd>"_s) << "and is kept as stored";
+}
+
+TEST(CheckListModel, APrefixIsFoundFromTheTopWithoutRegardToCase)
+{
+    PickerList model;
     EXPECT_EQ(model.findPrefix(1, u"ALP"_s), 1) << "the first from the top, without regard to case";
     EXPECT_EQ(model.findPrefix(1, u"gamma!"_s), -1);
     EXPECT_EQ(model.findPrefix(1, QString()), -1) << "an empty search finds nothing";
