@@ -152,6 +152,13 @@ TEST_F(MainCardTest, SavingStoresWhatThePagesHoldAndShowsNothing)
     EXPECT_TRUE(messages.boxes.isEmpty());
 }
 
+TEST_F(MainCardTest, TheDepartmentCaptionLooksLikeTheLinkItIs)
+{
+    EXPECT_TRUE(c().LblDept->font().underline());
+    EXPECT_EQ(c().LblDept->foregroundRole(), QPalette::Link);
+    EXPECT_EQ(c().LblDept->cursor().shape(), Qt::PointingHandCursor);
+}
+
 TEST_F(MainCardTest, ClosingWithUnsavedOptionsAsksToSaveThemAndCancelStays)
 {
     QStringList asked;

@@ -59,6 +59,11 @@ QGroupBox* buildLines(MainCardControls& c)
             c.LblDept->setObjectName(u"LblDept"_s);
             c.LblDept->setToolTip(u"תקתק להחלפת שדה"_s);
             c.LblDept->setCursor(Qt::PointingHandCursor);
+            // It looks like what it is, a link that switches the field, not a plain caption.
+            QFont link = c.LblDept->font();
+            link.setUnderline(true);
+            c.LblDept->setFont(link);
+            c.LblDept->setForegroundRole(QPalette::Link);
             grid->addWidget(c.LblDept, row, 1);
         } else if (!line.caption.isEmpty()) {
             grid->addWidget(caption(line.caption), row, 1);
