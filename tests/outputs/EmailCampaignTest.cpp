@@ -199,6 +199,18 @@ TEST_F(EmailCampaignTest, ARecipientThatCannotBeReachedDropsItsWholeGroup)
     EXPECT_TRUE(messages.boxes[0].text.startsWith(u"Cannot resolve address 'שבע<x@a7.test>"_s));
 }
 
+TEST_F(EmailCampaignTest, ARecipientTheServerPutsOffIsDroppedLikeOneItRefuses)
+{
+    cards(u"M01"_s, u"M03"_s);
+    SmtpSink::Options busy;
+    busy.deferred = {mAddress(2)};
+    SmtpSink sink(busy);
+    EXPECT_EQ(send(sink), u"נשלחו 2 הודעות; 1 נמענים לא קיבלו את ההודעה."_s);
+    EXPECT_EQ(messages.boxes,
+              (QList<Box>{{u"exclamation"_s, {}, u"Cannot resolve address 'לקוח 02<m02@example.test>'"_s}}));
+    EXPECT_FALSE(state.StopRequested);
+}
+
 TEST_F(EmailCampaignTest, AServerThatGoesAwayEndsTheRunAndARerunGoesOnOrStartsOver)
 {
     options.emailMethod = 2;

@@ -109,6 +109,8 @@ QStringList SmtpSink::arguments(const Options& options) const
                           dir_.filePath(QStringLiteral("mail"))};
     for (const QString& address : options.refused)
         arguments << QStringLiteral("--refuse") << address;
+    for (const QString& address : options.deferred)
+        arguments << QStringLiteral("--defer") << address;
     if (options.startTls || options.implicitTls)
         arguments << QStringLiteral("--tls-cert") << certificate_ << QStringLiteral("--tls-key")
                   << dir_.filePath(QStringLiteral("key.pem"));

@@ -31,6 +31,8 @@ public:
         // RCPT TO of these addresses (compared exactly) is answered
         // "550 5.1.1 <address>: Recipient address rejected".
         QStringList refused;
+        // RCPT TO of these is answered "450 4.2.1 <address>: Mailbox busy, try again later".
+        QStringList deferred;
         // Offers STARTTLS (without requiring it) with a self-signed certificate for 127.0.0.1 and
         // localhost; a client must trust certificateFile().
         bool startTls = false;

@@ -36,9 +36,10 @@ def write_atomically(path, data):
 class Recorder:
     """The aiosmtpd handler: refuses the chosen recipients and records what is accepted."""
 
-    def __init__(self, folder, refused):
+    def __init__(self, folder, refused, deferred):
         self.folder = folder
         self.refused = set(refused)
+        self.deferred = set(deferred)
         self.accepted = 0
         self.connections = 0
         self.count_connection(0)
@@ -50,6 +51,8 @@ class Recorder:
     async def handle_RCPT(self, server, session, envelope, address, rcpt_options):
         if address in self.refused:
             return f"550 5.1.1 <{address}>: Recipient address rejected"
+        if address in self.deferred:
+            return f"450 4.2.1 <{address}>: Mailbox busy, try again later"
         envelope.rcpt_tos.append(address)
         envelope.rcpt_options.extend(rcpt_options)
         return "250 OK"
@@ -86,6 +89,7 @@ def parse_arguments():
     parser.add_argument("--port", type=int, default=0, help="0: a free port")
     parser.add_argument("--folder", required=True)
     parser.add_argument("--refuse", action="append", default=[], metavar="ADDR")
+    parser.add_argument("--defer", action="append", default=[], metavar="ADDR", help="450 at RCPT TO")
     parser.add_argument("--tls-cert")
     parser.add_argument("--tls-key")
     parser.add_argument("--require-tls", action="store_true")
@@ -130,7 +134,7 @@ def session_options(arguments):
 
 async def serve(arguments):
     os.makedirs(arguments.folder, exist_ok=True)
-    recorder = Recorder(arguments.folder, arguments.refuse)
+    recorder = Recorder(arguments.folder, arguments.refuse, arguments.defer)
     options = session_options(arguments)
     loop = asyncio.get_running_loop()
 
