@@ -86,6 +86,20 @@ public:
     }
 };
 
+TEST(Properties, OnlyTheSixtyFourPropertiesTakeANameFromTheTable)
+{
+    const auto engine = makeSqliteEngine();
+    engine->createDatabase(u"props"_s,
+                           {u"CREATE TABLE OCQG (GroupCode INTEGER, GroupName VARCHAR(30))"_s,
+                            u"INSERT INTO OCQG VALUES (0, 'zero'), (1, 'first'), (64, 'last'), (65, 'past')"_s});
+    QVector<CheckListModel::Row> properties = unnamedProperties();
+    nameProperties(engine->client(), engine->connString(u"props"_s), properties);
+    ASSERT_EQ(properties.size(), 64);
+    EXPECT_EQ(properties.front().texts, QStringList{u"first"_s});
+    EXPECT_EQ(properties.back().texts, QStringList{u"last"_s});
+    EXPECT_EQ(properties[1].texts, QStringList{u"-"_s}) << "a property the table does not name";
+}
+
 TEST(SalesEmployees, TheListIsRefilledFromTheTableAndKeptWhenTheTableIsEmpty)
 {
     const auto engine = makeSqliteEngine();

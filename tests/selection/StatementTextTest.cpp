@@ -129,7 +129,8 @@ TEST(StatementText, DatesAreReadDayFirstWithTwoDigitYearsAndRollOver)
     EXPECT_EQ(DateFromText(u"1/1/100"_s), QDate(100, 1, 1)) << "three digits are taken as written";
     EXPECT_EQ(DateFromText(u"32/12/2004"_s), QDate(2005, 1, 1));
     EXPECT_EQ(DateFromText(u"1/13/2004"_s), QDate(2005, 1, 1));
-    for (const QString& text : {u"2004-06-15"_s, QString(), u"1/-1/05"_s, u"+1/1/05"_s, u"1/1/"_s, u"1/1/0x5"_s}) {
+    for (const QString& text :
+         {u"2004-06-15"_s, QString(), u"1/-1/05"_s, u"+1/1/05"_s, u"1/1/"_s, u"1/1/0x5"_s, u"123/05"_s}) {
         try {
             DateFromText(text);
             ADD_FAILURE() << text.toStdString();
