@@ -38,6 +38,15 @@ bool numeric(const QString& text)
     return ok && std::isfinite(number);
 }
 
+// Recipients per message: the group size of method 2 when it is a number, else one. Throws
+// Failure naming the box for a number outside 1..32767.
+int groupSizeOf(const MailingOptions& o)
+{
+    if (o.emailMethod != 2 || !numeric(o.emailGroupSize))
+        return 1;
+    return wholeNumberIn(o.emailGroupSize, u"גודל הקבוצה"_s, 1, kLargestGroup);
+}
+
 // The first option that keeps the run from starting, as the message the user is shown; empty
 // when the options are complete.
 QString optionsRefusal(const MailingOptions& o)
@@ -55,8 +64,7 @@ QString optionsRefusal(const MailingOptions& o)
     if (o.emailMethod == 2 && o.emailToMain.isEmpty())
         return u"חובה לציין נמען ראשי בשיטה זו"_s;
     try {
-        if (o.emailMethod == 2 && numeric(o.emailGroupSize))
-            wholeNumberIn(o.emailGroupSize, u"גודל הקבוצה"_s, 1, kLargestGroup);
+        groupSizeOf(o);
         wholeNumberIn(o.smtpPort, u"פורט"_s, 1, 65535);
     } catch (const Failure& refusal) {
         return refusal.description();
@@ -64,14 +72,6 @@ QString optionsRefusal(const MailingOptions& o)
     if (o.smtpServer.trimmed().isEmpty())
         return u"חובה לציין שרת דואר יוצא"_s;
     return {};
-}
-
-// Recipients per message: the group size of method 2 when it is a number, else one.
-int groupSizeOf(const MailingOptions& o)
-{
-    if (o.emailMethod != 2 || !numeric(o.emailGroupSize))
-        return 1;
-    return wholeNumberIn(o.emailGroupSize, u"גודל הקבוצה"_s, 1, kLargestGroup);
 }
 
 // How a recipient is named in the box that says it cannot be reached.
